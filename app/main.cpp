@@ -1,0 +1,3 @@
+#include "app/config_tool.h"
+
+wxIMPLEMENT_APP(ConfigTool);
