@@ -1,0 +1,2 @@
+#pragma once
+// STUB: replaced by the safe save.
