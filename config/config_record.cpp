@@ -45,6 +45,3 @@ void ConfigRecord::RemoveLibrary(const std::string& name)
     const auto last = std::upper_bound(first, library_definitions.end(), name, NameBefore);
     library_definitions.erase(first, last);
 }
-
-void ConfigRecord::ReadIni(wxConfigBase&) {}
-void ConfigRecord::WriteIni(wxConfigBase&) const {}
