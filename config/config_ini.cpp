@@ -219,10 +219,7 @@ std::vector<std::string> ReadValues(wxConfigBase& ini, const wxString& prefix)
     return values;
 }
 
-wxString LineKey(size_t number)
-{
-    return wxString::Format("line%zu", number);
-}
+wxString LineKey(size_t number) { return wxString::Format("line%zu", number); }
 
 } // namespace
 
