@@ -6,6 +6,7 @@
 #include <wx/treebase.h>
 
 #include <memory>
+#include <vector>
 
 class wxCloseEvent;
 class wxFlexGridSizer;
@@ -27,6 +28,8 @@ class ConfigFrame : public wxFrame
     // Controls are looked up each time, never kept; nullptr means "skip the control".
     template <class T> T* FindCtrl(int id) const { return dynamic_cast<T*>(FindWindow(id)); }
     wxTreeCtrl* Tree() const;
+    // Widens (or heightens) the window where a page would not fit in the page host.
+    void GrowToShowPages();
 
     const ConfigRecord& Config() const { return *m_config; }
     ConfigRecord& Config() { return *m_config; }
@@ -87,10 +90,32 @@ class ConfigFrame : public wxFrame
     // Page selection (tree/page_selection.cpp).
     void OnTreeSelChanged(wxTreeEvent& event);
     void LoadPageControls(wxWindow* page, int pageId);
+    void LoadLibraryEditor();
     void OnExpandNode(wxCommandEvent& event);
     void OnCollapseNode(wxCommandEvent& event);
     static void ExpandSubtree(wxTreeCtrl* tree, const wxTreeItemId& node);
     static void CollapseSubtree(wxTreeCtrl* tree, const wxTreeItemId& node);
+    // The generic tree never stays without a selection: it selects the root in AddRoot, and
+    // when the selected node is deleted it selects another at idle time, raising the selection
+    // event, which would switch or reload the page. Instead the frame remembers where the
+    // selection was and puts it back itself, without the event.
+    struct NodeKey
+    {
+        const wxWindow* page;
+        int pageId;
+        bool hasData;
+        wxString text;
+
+        static NodeKey Of(const wxTreeCtrl* tree, const wxTreeItemId& node);
+        bool SameNode(const NodeKey& other) const;
+    };
+    void KeepSelectionThrough(wxTreeCtrl* tree, const wxTreeItemId& emptied);
+    void RestoreLostSelection(wxTreeCtrl* tree);
+    void SelectQuietly(wxTreeCtrl* tree, const wxTreeItemId& node);
+    void OnInternalIdle() override;
+    std::vector<NodeKey> m_lostSelection; // steps from the root to the node that was selected
+    bool m_selectionLost = false;
+    bool m_quietSelection = false; // set while the frame itself moves the selection
 
     // Netlist type page (pages/netlist_type_page.cpp).
     wxSizer* BuildNetlistTypePage(wxWindow* parent, bool callFit, bool setSizer);

@@ -6,15 +6,22 @@
 #include <wx/splitter.h>
 #include <wx/toolbar.h>
 
-bool ConfigTool::OnInit()
+ConfigFrame* OpenMainWindow()
 {
-    // No base OnInit: it would parse the command line and refuse unexpected arguments, while the
-    // netlister passes one path and anything after it is ignored.
     auto* frame = new ConfigFrame(nullptr, wxID_ANY, "ZIDOVADE Configuration Tool", wxPoint(20, 20),
                                   wxSize(520, 450));
     if (auto* splitter = frame->FindCtrl<wxSplitterWindow>(ID_SPLITTER))
         splitter->SetSashPosition(180, true);
+    frame->GrowToShowPages();
     frame->Show(true);
+    return frame;
+}
+
+bool ConfigTool::OnInit()
+{
+    // No base OnInit: it would parse the command line and refuse unexpected arguments, while the
+    // netlister passes one path and anything after it is ignored.
+    ConfigFrame* frame = OpenMainWindow();
 
     if (argc > 1)
     {

@@ -1,9 +1,57 @@
-// STUB: replaced by the page implementation.
 #include "app/config_frame.h"
 
-#include <wx/sizer.h>
+#include "app/ids.h"
+#include "app/page_layout.h"
+#include "pages/page_controls.h"
 
-wxSizer* ConfigFrame::BuildSpicePage(wxWindow*, bool, bool) { return nullptr; }
-void ConfigFrame::OnSpiceAddPrefix(wxCommandEvent&) {}
-void ConfigFrame::OnSpiceAddUnit(wxCommandEvent&) {}
-void ConfigFrame::OnSpiceAddMosFactor(wxCommandEvent&) {}
+#include <wx/intl.h>
+#include <wx/sizer.h>
+#include <wx/statbox.h>
+
+wxSizer* ConfigFrame::BuildSpicePage(wxWindow* parent, bool callFit, bool setSizer)
+{
+    auto* top = new wxFlexGridSizer(1, 0, 0);
+    top->AddGrowableCol(0);
+    top->AddGrowableRow(0);
+
+    auto* options =
+        new wxStaticBoxSizer(new wxStaticBox(parent, wxID_ANY, _("Spice Options")), wxVERTICAL);
+    AddOptionRow(options,
+                 NewCheckBox(parent, ID_SPICE_ADD_PREFIX,
+                             _("Always add primitive prefix in front of instance name"),
+                             _("Add the primitive prefix even if the instance name  already starts "
+                               "with this prefix")));
+    AddOptionRow(
+        options,
+        NewCheckBox(parent, ID_SPICE_ADD_UNIT, _("Add unit after primitive value"),
+                    _("Add unit for transistor parameters values (L, W, AS, AD, PS, PD)")));
+    AddOptionRow(options,
+                 NewCheckBox(parent, ID_SPICE_ADD_MOS_FACTOR, _("Add MOS multiplicator factor"),
+                             _("Indicate that transistors are connected in parallel so "
+                               "the effective  widths are multiplied by the "
+                               "multiplicity M")));
+    top->Add(options, 0, wxGROW | wxALL, 5);
+
+    return InstallPageSizer(parent, top, callFit, setSizer);
+}
+
+void ConfigFrame::OnSpiceAddPrefix(wxCommandEvent& event)
+{
+    m_config->add_always_prefix = event.IsChecked();
+    m_config->saved = false;
+    RefreshNodeLabel(NODE_SPICE_ADD_PREFIX);
+}
+
+void ConfigFrame::OnSpiceAddUnit(wxCommandEvent& event)
+{
+    m_config->add_unit = event.IsChecked();
+    m_config->saved = false;
+    RefreshNodeLabel(NODE_SPICE_ADD_UNIT);
+}
+
+void ConfigFrame::OnSpiceAddMosFactor(wxCommandEvent& event)
+{
+    m_config->add_mos_multi_prefix = event.IsChecked();
+    m_config->saved = false;
+    RefreshNodeLabel(NODE_SPICE_ADD_MOS_FACTOR);
+}

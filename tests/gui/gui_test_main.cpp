@@ -1,5 +1,7 @@
 #include "tests/gui/gui_test.h"
 
+#include "app/config_tool.h"
+
 #include <wx/app.h>
 #include <wx/checkbox.h>
 #include <wx/log.h>
@@ -55,11 +57,7 @@ wxTreeItemId FindByText(wxTreeCtrl* tree, const wxTreeItemId& node, const wxStri
 
 void FrameTest::SetUp()
 {
-    m_frame = new ConfigFrame(nullptr, wxID_ANY, "ZIDOVADE Configuration Tool", wxPoint(20, 20),
-                              wxSize(520, 450));
-    if (auto* splitter = m_frame->FindCtrl<wxSplitterWindow>(ID_SPLITTER))
-        splitter->SetSashPosition(180, true);
-    m_frame->Show();
+    m_frame = OpenMainWindow();
     wxYield();
 }
 
