@@ -77,9 +77,7 @@ wxSizer* ConfigFrame::BuildCommonPage(wxWindow* parent, bool callFit, bool setSi
 
 void ConfigFrame::OnOpenConfigDialog(wxCommandEvent& event)
 {
-    m_config->open_config_dialog = event.IsChecked();
-    m_config->saved = false;
-    RefreshNodeLabel(NODE_OPEN_CONFIG_DIALOG);
+    StoreCheck(*this, &ConfigRecord::open_config_dialog, event, NODE_OPEN_CONFIG_DIALOG);
 }
 
 void ConfigFrame::OnBackupNetlist(wxCommandEvent& event)
@@ -101,16 +99,12 @@ void ConfigFrame::OnBackupExtension(wxCommandEvent& event)
 
 void ConfigFrame::OnShowNetlist(wxCommandEvent& event)
 {
-    m_config->show_nsx = event.IsChecked();
-    m_config->saved = false;
-    RefreshNodeLabel(NODE_SHOW_NETLIST);
+    StoreCheck(*this, &ConfigRecord::show_nsx, event, NODE_SHOW_NETLIST);
 }
 
 void ConfigFrame::OnShowPattern(wxCommandEvent& event)
 {
-    m_config->show_pat = event.IsChecked();
-    m_config->saved = false;
-    RefreshNodeLabel(NODE_SHOW_PATTERN);
+    StoreCheck(*this, &ConfigRecord::show_pat, event, NODE_SHOW_PATTERN);
 }
 
 void ConfigFrame::OnRunOrvik(wxCommandEvent& event)
@@ -123,7 +117,5 @@ void ConfigFrame::OnRunOrvik(wxCommandEvent& event)
 
 void ConfigFrame::OnLoadCircuit(wxCommandEvent& event)
 {
-    m_config->load_circuit = event.IsChecked();
-    m_config->saved = false;
-    RefreshNodeLabel(NODE_LOAD_CIRCUIT);
+    StoreCheck(*this, &ConfigRecord::load_circuit, event, NODE_LOAD_CIRCUIT);
 }

@@ -91,14 +91,10 @@ void ConfigFrame::OnDefaultLanguage(wxCommandEvent& event)
 
 void ConfigFrame::OnFlattenNetlist(wxCommandEvent& event)
 {
-    m_config->flat = event.IsChecked();
-    m_config->saved = false;
-    RefreshNodeLabel(NODE_FLATTEN_NETLIST);
+    StoreCheck(*this, &ConfigRecord::flat, event, NODE_FLATTEN_NETLIST);
 }
 
 void ConfigFrame::OnFlattenBusses(wxCommandEvent& event)
 {
-    m_config->flat_busses = event.IsChecked();
-    m_config->saved = false;
-    RefreshNodeLabel(NODE_FLATTEN_BUSSES);
+    StoreCheck(*this, &ConfigRecord::flat_busses, event, NODE_FLATTEN_BUSSES);
 }

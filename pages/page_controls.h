@@ -19,6 +19,15 @@ inline wxCheckBox* NewCheckBox(wxWindow* parent, int id, const wxString& label, 
 // vertical sizer, and wx asserts on flags it ignores.
 inline void AddOptionRow(wxSizer* column, wxWindow* control) { column->Add(control, 0, wxALL, 5); }
 
+// The change every option check box makes: its field, the unsaved mark, its node's label.
+inline void StoreCheck(ConfigFrame& frame, bool ConfigRecord::*field, const wxCommandEvent& event,
+                       int pageId)
+{
+    frame.Config().*field = event.IsChecked();
+    frame.Config().saved = false;
+    frame.RefreshNodeLabel(pageId);
+}
+
 // Refills the children of the node with the given PageId and opens it; a node that is not in
 // the tree is skipped. `fill` is one of the frame's refillers.
 using NodeFiller = void (ConfigFrame::*)(wxTreeCtrl*, const wxTreeItemId&);

@@ -75,16 +75,12 @@ wxSizer* ConfigFrame::BuildPatternPage(wxWindow* parent, bool callFit, bool setS
 
 void ConfigFrame::OnAddGlobalDirective(wxCommandEvent& event)
 {
-    m_config->add_global = event.IsChecked();
-    m_config->saved = false;
-    RefreshNodeLabel(NODE_ADD_GLOBAL);
+    StoreCheck(*this, &ConfigRecord::add_global, event, NODE_ADD_GLOBAL);
 }
 
 void ConfigFrame::OnAddDcSources(wxCommandEvent& event)
 {
-    m_config->add_dc_sources = event.IsChecked();
-    m_config->saved = false;
-    RefreshNodeLabel(NODE_ADD_DC_SOURCES);
+    StoreCheck(*this, &ConfigRecord::add_dc_sources, event, NODE_ADD_DC_SOURCES);
 }
 
 void ConfigFrame::OnLibraryPathSelected(wxCommandEvent& event)

@@ -37,21 +37,15 @@ wxSizer* ConfigFrame::BuildSpicePage(wxWindow* parent, bool callFit, bool setSiz
 
 void ConfigFrame::OnSpiceAddPrefix(wxCommandEvent& event)
 {
-    m_config->add_always_prefix = event.IsChecked();
-    m_config->saved = false;
-    RefreshNodeLabel(NODE_SPICE_ADD_PREFIX);
+    StoreCheck(*this, &ConfigRecord::add_always_prefix, event, NODE_SPICE_ADD_PREFIX);
 }
 
 void ConfigFrame::OnSpiceAddUnit(wxCommandEvent& event)
 {
-    m_config->add_unit = event.IsChecked();
-    m_config->saved = false;
-    RefreshNodeLabel(NODE_SPICE_ADD_UNIT);
+    StoreCheck(*this, &ConfigRecord::add_unit, event, NODE_SPICE_ADD_UNIT);
 }
 
 void ConfigFrame::OnSpiceAddMosFactor(wxCommandEvent& event)
 {
-    m_config->add_mos_multi_prefix = event.IsChecked();
-    m_config->saved = false;
-    RefreshNodeLabel(NODE_SPICE_ADD_MOS_FACTOR);
+    StoreCheck(*this, &ConfigRecord::add_mos_multi_prefix, event, NODE_SPICE_ADD_MOS_FACTOR);
 }
