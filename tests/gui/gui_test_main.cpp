@@ -1,6 +1,7 @@
 #include "tests/gui/gui_test.h"
 
 #include "app/config_tool.h"
+#include "tests/test_guards.h"
 
 #include <wx/app.h>
 #include <wx/checkbox.h>
@@ -19,25 +20,6 @@ class TestApp : public wxApp
   public:
     bool OnInit() override { return true; }
 };
-
-// A warning or error would be a message box in the program: here it fails the test.
-class FailingLog : public wxLog
-{
-  protected:
-    void DoLogRecord(wxLogLevel level, const wxString& msg, const wxLogRecordInfo&) override
-    {
-        if (level <= wxLOG_Warning)
-            ADD_FAILURE() << "log message box: " << msg.utf8_str().data();
-    }
-};
-
-void FailOnAssert(const wxString& file, int line, const wxString& func, const wxString& cond,
-                  const wxString& msg)
-{
-    ADD_FAILURE() << "wx assert " << file.utf8_str().data() << ":" << line << " in "
-                  << func.utf8_str().data() << ": " << cond.utf8_str().data() << " "
-                  << msg.utf8_str().data();
-}
 
 wxTreeItemId FindByText(wxTreeCtrl* tree, const wxTreeItemId& node, const wxString& text)
 {
@@ -132,8 +114,7 @@ int main(int argc, char** argv)
         fprintf(stderr, "cannot start the GUI (is there a display?)\n");
         return 1;
     }
-    wxSetAssertHandler(FailOnAssert);
-    delete wxLog::SetActiveTarget(new FailingLog);
+    InstallTestGuards();
     const int result = RUN_ALL_TESTS();
     wxTheApp->OnExit();
     wxEntryCleanup();
