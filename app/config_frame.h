@@ -73,6 +73,7 @@ class ConfigFrame : public wxFrame
     void OnOpenConfig(wxCommandEvent& event);
     void OnSaveConfig(wxCommandEvent& event);
     void OnSaveConfigAs(wxCommandEvent& event);
+    bool MaySetConfigAside();
 
     // Option tree (tree/option_tree.cpp).
     void BuildNetlistBranch(wxTreeCtrl* tree, const wxTreeItemId& parent);

@@ -5,7 +5,7 @@ ROOT=$(cd "$(dirname "${BASH_SOURCE[0]}")/.." && pwd)
 BUILD_DIR=${BUILD_DIR:-$ROOT/build}
 
 BUILD_PACKAGES=(g++ cmake make libwxgtk3.2-dev)
-TEST_PACKAGES=(libgtest-dev xvfb xauth xdotool clang-format)
+TEST_PACKAGES=(libgtest-dev xvfb xauth xdotool clang-format libx11-dev)
 
 install_missing() {
     local missing=() package

@@ -18,6 +18,14 @@ class FailingModalHook : public wxTestingModalHook
     using wxTestingModalHook::wxTestingModalHook;
 
   protected:
+    // A dialog nobody expected is cancelled after the failure is reported: shown for real, it
+    // would wait for an answer that never comes.
+    int Enter(wxDialog* dialog) override
+    {
+        const int answer = wxTestingModalHook::Enter(dialog);
+        return answer == wxID_NONE ? wxID_CANCEL : answer;
+    }
+
     void ReportFailure(const wxString& msg) override { ADD_FAILURE() << msg.utf8_str().data(); }
 };
 
