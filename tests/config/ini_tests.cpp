@@ -5,6 +5,7 @@
 
 #include <wx/fileconf.h>
 
+#include <algorithm>
 #include <cstring>
 #include <random>
 
@@ -20,50 +21,25 @@ ConfigRecord Read(const std::string& file)
 
 ConfigRecord WriteThenRead(const ConfigRecord& record) { return Read(FormatIni(record)); }
 
-std::string Lines(std::initializer_list<const char*> lines)
+// The file's lines joined by blanks, so that a whole file reads as a few lines here.
+std::string Flat(std::string file)
 {
-    std::string text;
-    for (const char* line : lines)
-        text += std::string(line) + "\n";
-    return text;
+    std::replace(file.begin(), file.end(), '\n', ' ');
+    return file;
 }
 
 } // namespace
 
 TEST(IniFormat, DefaultRecordWritesEveryGroupAndKeyInOrder)
 {
-    EXPECT_EQ(FormatIni(ConfigRecord()), Lines({"[Defaults]",
-                                                "release=5.5.0",
-                                                "spice=yes",
-                                                "verilog=no",
-                                                "vhdl=no",
-                                                "default_orviktype=A",
-                                                "flat=no",
-                                                "flat_busses=no",
-                                                "open_config_dialog=no",
-                                                "backup_extension=.bak",
-                                                "show_in_orvik=yes",
-                                                "create_backup_file=no",
-                                                "add_global=no",
-                                                "add_dc_sources=no",
-                                                "generate=no",
-                                                "show_nsx=no",
-                                                "show_pat=no",
-                                                "run_orvik=yes",
-                                                "[Spice]",
-                                                "add_unit=no",
-                                                "add_mos_multi_prefix=no",
-                                                "add_always_prefix=no",
-                                                "use_spice_primitive=no",
-                                                "[Verilog]",
-                                                "use_named_port=no",
-                                                "case=A",
-                                                "global_net_as_supply=no",
-                                                "use_define_timescale=no",
-                                                "use_define_capacitor=no",
-                                                "[Generic]",
-                                                "line0=LIBRARY ieee;",
-                                                "line1=USE ieee.std_logic_1164.ALL;"}));
+    EXPECT_EQ(Flat(FormatIni(ConfigRecord())),
+              "[Defaults] release=5.5.0 spice=yes verilog=no vhdl=no default_orviktype=A flat=no "
+              "flat_busses=no open_config_dialog=no backup_extension=.bak show_in_orvik=yes "
+              "create_backup_file=no add_global=no add_dc_sources=no generate=no show_nsx=no "
+              "show_pat=no run_orvik=yes [Spice] add_unit=no add_mos_multi_prefix=no "
+              "add_always_prefix=no use_spice_primitive=no [Verilog] use_named_port=no case=A "
+              "global_net_as_supply=no use_define_timescale=no use_define_capacitor=no "
+              "[Generic] line0=LIBRARY ieee; line1=USE ieee.std_logic_1164.ALL; ");
 }
 
 TEST(IniFormat, PresentTextsAreWrittenEvenWhenEmptyAndPathsComeFirst)
@@ -72,28 +48,23 @@ TEST(IniFormat, PresentTextsAreWrittenEvenWhenEmptyAndPathsComeFirst)
     record.library_paths = {"/b", "/a", "/b"};
     record.supply0 = "";
     record.use_lib_section = "Generic";
-    const std::string file = FormatIni(record);
-    EXPECT_EQ(file.rfind("[Library_path]\npath0=/b\npath1=/a\npath2=/b\n[Defaults]\n", 0), 0u);
-    EXPECT_NE(file.find("global_net_as_supply=no\nsupply0=\nuse_define_timescale=no\n"),
-              std::string::npos);
-    EXPECT_NE(file.find("[VHDL]\nuse_lib_section=Generic\n"), std::string::npos);
+    const std::string file = Flat(FormatIni(record));
+    EXPECT_EQ(file.rfind("[Library_path] path0=/b path1=/a path2=/b [Defaults] ", 0), 0u);
+    EXPECT_NE(file.find("global_net_as_supply=no supply0= use_define_timescale=no "), file.npos);
+    EXPECT_NE(file.find("[VHDL] use_lib_section=Generic "), file.npos);
 }
 
 TEST(IniFormat, MissingKeysTakeTheirMissingValues)
 {
     ConfigRecord record;
-    record.generate = true;
     record.file_path = "/x.ini";
     record.saved = false;
     record.library_paths = {"/old"};
-    ReadIniBytes("", record);
+    ReadIniBytes("[Defaults]\ngenerate=yes\n", record);
 
-    EXPECT_FALSE(record.spice);
-    EXPECT_FALSE(record.run_orvik);
-    EXPECT_FALSE(record.load_circuit);
+    EXPECT_FALSE(record.spice || record.run_orvik || record.load_circuit);
     EXPECT_TRUE(record.use_named_port);
-    EXPECT_EQ(record.default_orviktype, 'D');
-    EXPECT_EQ(record.case_, 'U');
+    EXPECT_EQ(std::string({record.default_orviktype, record.case_}), "DU");
     EXPECT_EQ(record.backup_extension, ".bak");
     EXPECT_EQ(record.timescale_unit, "1ns");
     EXPECT_EQ(record.timescale_precision, "1ps");
@@ -104,66 +75,39 @@ TEST(IniFormat, MissingKeysTakeTheirMissingValues)
         EXPECT_EQ(*text, std::optional<std::string>("")); // present and empty, not absent
     EXPECT_TRUE(record.library_paths.empty());
     EXPECT_TRUE(record.library_definitions.empty()); // the file replaces "Generic"
-    // What is the tool's own is not taken from a file.
-    EXPECT_TRUE(record.generate);
+    // What is the tool's own is never taken from a file.
+    EXPECT_FALSE(record.generate);
     EXPECT_EQ(record.file_path, "/x.ini");
     EXPECT_FALSE(record.saved);
 }
 
-TEST(IniFormat, GenerateIsNeverReadFromTheFile)
+TEST(IniFormat, ValueFormsReadAsTheFormatSays)
 {
-    EXPECT_FALSE(Read("[Defaults]\ngenerate=yes\n").generate);
+    struct Case
+    {
+        const char* flag;
+        const char* orvikType;
+        const char* letterCase;
+        bool yes;
+        const char* codes; // default_orviktype, then case
+    };
+    // Only "yes" in any case is yes; a code letter is the first character, with case, or the
+    // fallback.
+    const Case cases[] = {
+        {"yes", "A", "A", true, "AA"},       {"YES", "VHDL-AMS", "Lower", true, "VL"},
+        {"yEs", "vhdl", "l", true, "DU"},    {"1", "", "x", false, "DU"},
+        {"true", "\xE9", "", false, "DU"},   {"y", "D", "U", false, "DU"},
+        {"yes please", "", "", false, "DU"}, {"", "", "", false, "DU"}};
+    for (const Case& c : cases)
+    {
+        const ConfigRecord record = Read(std::string("[Spice]\nadd_unit=") + c.flag +
+                                         "\n[Defaults]\ndefault_orviktype=" + c.orvikType +
+                                         "\n[Verilog]\ncase=" + c.letterCase + "\n");
+        EXPECT_EQ(record.add_unit, c.yes) << c.flag;
+        EXPECT_EQ(std::string({record.default_orviktype, record.case_}), c.codes)
+            << c.orvikType << " " << c.letterCase;
+    }
 }
-
-struct FlagCase
-{
-    const char* value;
-    bool yes;
-};
-class YesNoValues : public testing::TestWithParam<FlagCase>
-{
-};
-
-TEST_P(YesNoValues, OnlyYesInAnyCaseReadsAsYes)
-{
-    const ConfigRecord record = Read(std::string("[Spice]\nadd_unit=") + GetParam().value + "\n");
-    EXPECT_EQ(record.add_unit, GetParam().yes);
-}
-INSTANTIATE_TEST_SUITE_P(Values, YesNoValues,
-                         testing::Values(FlagCase{"yes", true}, FlagCase{"YES", true},
-                                         FlagCase{"yEs", true}, FlagCase{"1", false},
-                                         FlagCase{"true", false}, FlagCase{"y", false},
-                                         FlagCase{"", false}, FlagCase{"yes please", false},
-                                         FlagCase{"no", false}));
-
-struct CodeCase
-{
-    const char* key;
-    const char* value;
-    char expected;
-};
-class CodeLetters : public testing::TestWithParam<CodeCase>
-{
-};
-
-TEST_P(CodeLetters, FirstCharacterDecidesWithCaseElseFallback)
-{
-    const CodeCase& c = GetParam();
-    const bool isCase = std::string(c.key) == "case";
-    const ConfigRecord record =
-        Read(std::string(isCase ? "[Verilog]\n" : "[Defaults]\n") + c.key + "=" + c.value + "\n");
-    EXPECT_EQ(isCase ? record.case_ : record.default_orviktype, c.expected);
-}
-INSTANTIATE_TEST_SUITE_P(Values, CodeLetters,
-                         testing::Values(CodeCase{"default_orviktype", "A", 'A'},
-                                         CodeCase{"default_orviktype", "D", 'D'},
-                                         CodeCase{"default_orviktype", "VHDL-AMS", 'V'},
-                                         CodeCase{"default_orviktype", "vhdl", 'D'},
-                                         CodeCase{"default_orviktype", "", 'D'},
-                                         CodeCase{"default_orviktype", "\xE9", 'D'},
-                                         CodeCase{"case", "L", 'L'}, CodeCase{"case", "Lower", 'L'},
-                                         CodeCase{"case", "l", 'U'}, CodeCase{"case", "A", 'A'},
-                                         CodeCase{"case", "x", 'U'}, CodeCase{"case", "", 'U'}));
 
 TEST(IniFormat, ReservedGroupsInAnyCaseAreNeverLibraries)
 {
@@ -209,36 +153,22 @@ TEST(IniFormat, LibrariesWhoseNamesDifferOnlyInCaseLoseNoLine)
               (LibraryDefinitionList{{"IEEE", "A"}, {"IEEE", "B"}, {"IEEE", "c"}}));
 }
 
-struct LoadCircuitCase
+TEST(IniFormat, LoadCircuitIsReadFromShowInOrvikThenLoadCircuit)
 {
-    const char* file;
-    bool expected;
-};
-class LoadCircuitKeys : public testing::TestWithParam<LoadCircuitCase>
-{
-};
+    const std::pair<const char*, bool> cases[] = {{"show_in_orvik=yes\n", true},
+                                                  {"load_circuit=yes\n", true},
+                                                  {"show_in_orvik=no\nload_circuit=yes\n", false},
+                                                  {"show_in_orvik=yes\nload_circuit=no\n", true},
+                                                  {"", false}};
+    for (const auto& [lines, expected] : cases)
+        EXPECT_EQ(Read(std::string("[Defaults]\n") + lines).load_circuit, expected) << lines;
 
-TEST_P(LoadCircuitKeys, ShowInOrvikDecidesThenLoadCircuit)
-{
-    EXPECT_EQ(Read(std::string("[Defaults]\n") + GetParam().file).load_circuit,
-              GetParam().expected);
-}
-INSTANTIATE_TEST_SUITE_P(
-    Files, LoadCircuitKeys,
-    testing::Values(LoadCircuitCase{"show_in_orvik=yes\n", true},
-                    LoadCircuitCase{"load_circuit=yes\n", true},
-                    LoadCircuitCase{"show_in_orvik=no\nload_circuit=yes\n", false},
-                    LoadCircuitCase{"show_in_orvik=yes\nload_circuit=no\n", true},
-                    LoadCircuitCase{"", false}));
-
-TEST(IniFormat, LoadCircuitSurvivesSaveAndReload)
-{
-    for (const bool value : {true, false})
-    {
-        ConfigRecord record;
-        record.load_circuit = value;
-        EXPECT_EQ(WriteThenRead(record).load_circuit, value);
-    }
+    // A file the tool wrote reads back with the value it was written with.
+    ConfigRecord record;
+    record.load_circuit = false;
+    EXPECT_FALSE(WriteThenRead(record).load_circuit);
+    record.load_circuit = true;
+    EXPECT_TRUE(WriteThenRead(record).load_circuit);
 }
 
 TEST(IniFormat, ManyPathsAndLinesKeepTheUsersOrder)
@@ -285,28 +215,15 @@ ConfigRecord RandomRecord(std::mt19937& random)
     auto flag = [&] { return random() % 2 == 1; };
     auto pick = [&](const char* letters) { return letters[random() % std::strlen(letters)]; };
     ConfigRecord r;
-    for (bool* field : {&r.open_config_dialog,
-                        &r.create_backup_file,
-                        &r.show_nsx,
-                        &r.show_pat,
-                        &r.run_orvik,
-                        &r.load_circuit,
-                        &r.spice,
-                        &r.verilog,
-                        &r.vhdl,
-                        &r.flat,
-                        &r.flat_busses,
-                        &r.add_global,
-                        &r.add_dc_sources,
-                        &r.add_always_prefix,
-                        &r.add_unit,
-                        &r.add_mos_multi_prefix,
-                        &r.use_spice_primitive,
-                        &r.use_named_port,
-                        &r.global_net_as_supply,
-                        &r.use_define_timescale,
+    // clang-format off
+    for (bool* field : {&r.open_config_dialog, &r.create_backup_file, &r.show_nsx, &r.show_pat,
+                        &r.run_orvik, &r.load_circuit, &r.spice, &r.verilog, &r.vhdl, &r.flat,
+                        &r.flat_busses, &r.add_global, &r.add_dc_sources, &r.add_always_prefix,
+                        &r.add_unit, &r.add_mos_multi_prefix, &r.use_spice_primitive,
+                        &r.use_named_port, &r.global_net_as_supply, &r.use_define_timescale,
                         &r.use_define_capacitor})
         *field = flag();
+    // clang-format on
     r.default_orviktype = pick("ADV");
     r.case_ = pick("ULA");
     r.backup_extension = RandomText(random);
@@ -383,24 +300,16 @@ TEST(IniFormat, NonAsciiBytesComeBackExactlyWhateverTheEncoding)
 TEST(IniFormat, HostileFilesNeverCrashAndYieldDefinedValues)
 {
     std::mt19937 random(4711);
-    std::vector<std::string> files = {"",
-                                      std::string(1, '\0'),
-                                      "[",
-                                      "]",
-                                      "=",
-                                      "[]\n=\n==x\n",
-                                      "[a/b]\nq=2\n[a]\nx=1\n[a/b]\nr=3\n",
-                                      "[a/../Defaults]\nspice=yes\n[Defaults]\nflat=yes\n",
-                                      "[..]\nline0=x\n[.]\n[/]\n[//]\n",
-                                      "[Defaults\nspice=yes\n",
-                                      "\xFF\xFE\x01",
-                                      "\xFE\xFF"};
-    files.push_back("[Library_path]\npath0=" + std::string(2'000'000, 'x') + "\n");
-    files.push_back("[" + std::string(100'000, 'L') + "]\nline0=y\n");
+    // clang-format off
+    std::vector<std::string> files = {"", std::string(1, '\0'), "[", "]", "=", "[]\n=\n==x\n",
+        "[a/b]\nq=2\n[a]\nx=1\n[a/b]\nr=3\n", "[a/../Defaults]\nspice=yes\n[Defaults]\nflat=yes\n",
+        "[..]\nline0=x\n[.]\n[/]\n[//]\n", "[Defaults\nspice=yes\n", "\xFF\xFE\x01", "\xFE\xFF",
+        "[Library_path]\npath0=" + std::string(2'000'000, 'x') + "\n",
+        "[" + std::string(100'000, 'L') + "]\nline0=y\n"};
     // Structured junk: the pieces INI syntax is made of, in any order.
-    const char* pieces[] = {
-        "[", "]", "/", "=", "..", "\n",           "\r",       "\\",           "\"",    ";",    "#",
-        "$", "a", "B", " ", "\0", "\xEF\xBB\xBF", "Defaults", "Library_path", "line0", "path1"};
+    const std::string pieces[] = {"[", "]", "/", "=", "..", "\n", "\r", "\\", "\"", ";", "#", "$",
+        "a", "B", " ", {"\0", 1}, "\xEF\xBB\xBF", "Defaults", "Library_path", "line0", "path1"};
+    // clang-format on
     for (int i = 0; i < 3000; ++i)
     {
         std::string file;
