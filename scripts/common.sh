@@ -21,7 +21,10 @@ install_missing() {
     DEBIAN_FRONTEND=noninteractive "${sudo[@]}" apt-get install -y -qq "${missing[@]}" >/dev/null
 }
 
+# build [TARGET...]: everything when no target is named.
 build() {
     cmake -S "$ROOT" -B "$BUILD_DIR" -DCMAKE_COMPILE_WARNING_AS_ERROR=ON >/dev/null
-    cmake --build "$BUILD_DIR" -j"$(nproc)"
+    local targets=()
+    (($#)) && targets=(--target "$@")
+    cmake --build "$BUILD_DIR" -j"$(nproc)" "${targets[@]}"
 }
