@@ -4,8 +4,11 @@
 #include "config/text_conv.h"
 
 #include <wx/confbase.h>
+#include <wx/utils.h>
 
 #include <algorithm>
+#include <cctype>
+#include <cstring>
 #include <variant>
 
 namespace
@@ -156,70 +159,83 @@ bool ReadLoadCircuit(wxConfigBase& ini)
     return false;
 }
 
-// Decimal digits compared by value without converting them, so any length is safe.
-bool DigitsLess(const wxString& a, const wxString& b)
+// The number of a key made of the prefix (in any case, as the INI class matches keys) and
+// decimal digits, without its leading zeros; false for any other key.
+bool KeyNumber(const wxString& key, const char* prefix, std::string& number)
 {
-    const size_t za = a.find_first_not_of('0');
-    const size_t zb = b.find_first_not_of('0');
-    const wxString ta = za == wxString::npos ? wxString() : a.substr(za);
-    const wxString tb = zb == wxString::npos ? wxString() : b.substr(zb);
-    if (ta.length() != tb.length())
-        return ta.length() < tb.length();
-    return ta < tb;
+    const size_t length = std::strlen(prefix);
+    if (key.length() <= length)
+        return false;
+    number.clear();
+    for (size_t i = 0; i < key.length(); ++i)
+    {
+        const wxUniChar c = key[i];
+        if (i < length)
+        {
+            if (!c.IsAscii() || std::tolower(static_cast<char>(c)) != prefix[i])
+                return false;
+        }
+        else if (c < '0' || c > '9')
+            return false;
+        else if (c != '0' || !number.empty())
+            number.push_back(static_cast<char>(c));
+    }
+    return true;
 }
 
-// The INI class enumerates keys in name order, which puts "path10" before "path2". The order of
-// the entries is the user's, so numbered keys come first, by number; any others follow.
-std::vector<wxString> EntriesInFileOrder(wxConfigBase& ini, const wxString& prefix)
+// Every value of the current group, in the order the entries were written. The INI class
+// enumerates keys in name order, which puts "path10" before "path2"; the order is the user's, so
+// numbered keys come first, by number (of any length), and any others follow in the class's order.
+std::vector<std::string> ReadValues(wxConfigBase& ini, const char* prefix)
 {
-    struct Numbered
+    struct Entry
     {
-        wxString digits;
-        wxString key;
+        bool numbered;
+        std::string number;
+        std::string value;
     };
-    std::vector<Numbered> numbered;
-    std::vector<wxString> others;
-
-    wxString key;
+    std::vector<Entry> entries;
+    entries.reserve(ini.GetNumberOfEntries());
+    // Expanding copies every value, and only a value with a '$', '%' or backslash can change:
+    // the others are read as they stand.
+    const bool expand = ini.IsExpandingEnvVars();
+    ini.SetExpandEnvVars(false);
+    wxString key, value;
     long cookie = 0;
     for (bool more = ini.GetFirstEntry(key, cookie); more; more = ini.GetNextEntry(key, cookie))
     {
-        const wxString digits = key.Mid(prefix.length());
-        const bool isNumbered = key.length() > prefix.length() &&
-                                key.Left(prefix.length()).IsSameAs(prefix, false) &&
-                                std::all_of(digits.begin(), digits.end(),
-                                            [](wxUniChar c) { return c >= '0' && c <= '9'; });
-        if (isNumbered)
-            numbered.push_back({digits, key});
-        else
-            others.push_back(key);
-    }
-    std::stable_sort(numbered.begin(), numbered.end(),
-                     [](const Numbered& a, const Numbered& b)
-                     { return DigitsLess(a.digits, b.digits); });
-
-    std::vector<wxString> keys;
-    keys.reserve(numbered.size() + others.size());
-    for (const Numbered& entry : numbered)
-        keys.push_back(entry.key);
-    keys.insert(keys.end(), others.begin(), others.end());
-    return keys;
-}
-
-// Every value of the current group, in the order the entries were written.
-std::vector<std::string> ReadValues(wxConfigBase& ini, const wxString& prefix)
-{
-    std::vector<std::string> values;
-    for (const wxString& key : EntriesInFileOrder(ini, prefix))
-    {
-        wxString value;
+        Entry entry;
+        entry.numbered = KeyNumber(key, prefix, entry.number);
         ini.Read(key, &value);
-        values.push_back(IniToBytes(value));
+        if (expand && std::any_of(value.wx_str(), value.wx_str() + value.length(),
+                                  [](wchar_t c) { return c == '$' || c == '%' || c == '\\'; }))
+            value = wxExpandEnvVars(value);
+        entry.value = IniToBytes(value);
+        entries.push_back(std::move(entry));
     }
+    ini.SetExpandEnvVars(expand);
+    std::stable_sort(entries.begin(), entries.end(),
+                     [](const Entry& a, const Entry& b)
+                     {
+                         if (a.numbered != b.numbered || !a.numbered)
+                             return a.numbered && !b.numbered;
+                         if (a.number.length() != b.number.length())
+                             return a.number.length() < b.number.length();
+                         return a.number < b.number;
+                     });
+
+    std::vector<std::string> values;
+    values.reserve(entries.size());
+    for (Entry& entry : entries)
+        values.push_back(std::move(entry.value));
     return values;
 }
 
-wxString LineKey(size_t number) { return wxString::Format("line%zu", number); }
+// A numbered key; wxString::Format would cost more than the write itself.
+wxString NumberedKey(const char* prefix, size_t number)
+{
+    return wxString::FromAscii((prefix + std::to_string(number)).c_str());
+}
 
 } // namespace
 
@@ -229,7 +245,7 @@ void ConfigRecord::WriteIni(wxConfigBase& ini) const
     {
         ini.SetPath(wxString("/") + LIBRARY_PATH_GROUP);
         for (size_t i = 0; i < library_paths.size(); ++i)
-            ini.Write(wxString::Format("path%zu", i), BytesToIni(library_paths[i]));
+            ini.Write(NumberedKey("path", i), BytesToIni(library_paths[i]));
     }
 
     for (const Group& group : Groups())
@@ -253,10 +269,10 @@ void ConfigRecord::WriteIni(wxConfigBase& ini) const
             // Group names match without case, so "IEEE" and "ieee" share a group: go on after
             // the lines already there instead of overwriting them.
             lineNumber = 0;
-            while (ini.HasEntry(LineKey(lineNumber)))
+            while (ini.HasEntry(NumberedKey("line", lineNumber)))
                 ++lineNumber;
         }
-        ini.Write(LineKey(lineNumber++), BytesToIni(entry.line));
+        ini.Write(NumberedKey("line", lineNumber++), BytesToIni(entry.line));
     }
     ini.SetPath("/");
 }

@@ -19,13 +19,13 @@ std::string IniToBytes(const wxString& text)
 {
     std::string bytes;
     bytes.reserve(text.length());
-    for (const wxUniChar c : text)
+    const wxStringCharType* chars = text.wx_str();
+    for (size_t i = 0; i < text.length(); ++i)
     {
-        const wxUint32 code = c.GetValue();
-        if (code < 0x100)
-            bytes.push_back(static_cast<char>(code));
+        if (static_cast<wxUint32>(chars[i]) < 0x100)
+            bytes.push_back(static_cast<char>(chars[i]));
         else // only text from outside the file, an expanded variable, gets here
-            bytes += wxString(c).utf8_string();
+            bytes += wxString(chars[i]).utf8_string();
     }
     return bytes;
 }
