@@ -1,344 +1,353 @@
-#include "tests/gui/page_test.h"
+#include "tests/gui/gui_test.h"
+
+#include "config/text_conv.h"
 
 #include <wx/checkbox.h>
 #include <wx/combobox.h>
+#include <wx/dirdlg.h>
+#include <wx/filedlg.h>
+#include <wx/listbox.h>
 #include <wx/radiobox.h>
+#include <wx/stopwatch.h>
+#include <wx/treectrl.h>
 #include <wx/uiaction.h>
 
+#include <filesystem>
+#include <fstream>
+#include <map>
 #include <string>
+#include <tuple>
+#include <vector>
+
+#include <stdlib.h>
 
 namespace
 {
 
-// One check box of the netlist type, pattern, common and Spice pages with what it drives.
-struct CheckBoxCase
+// Each node's label by its id: a node replaced by a new one counts as changed.
+using Labels = std::map<void*, std::string>;
+
+void Walk(wxTreeCtrl* tree, const wxTreeItemId& node, const wxTreeItemId& skip, Labels& out)
 {
-    const char* name;
-    int id;
-    bool ConfigRecord::*field;
-    int node;
-    const char* format;
-};
-void PrintTo(const CheckBoxCase& c, std::ostream* os) { *os << c.name; }
+    out[node.GetID()] = tree->GetItemText(node).utf8_string();
+    wxTreeItemIdValue cookie;
+    for (auto child = tree->GetFirstChild(node, cookie); child.IsOk() && node != skip;
+         child = tree->GetNextChild(node, cookie))
+        Walk(tree, child, skip, out);
+}
 
-const CheckBoxCase CHECK_BOXES[] = {
-    {"FlattenNetlist", ID_FLATTEN_NETLIST, &ConfigRecord::flat, NODE_FLATTEN_NETLIST,
-     "Flatten netlist: %s"},
-    {"FlattenBusses", ID_FLATTEN_BUSSES, &ConfigRecord::flat_busses, NODE_FLATTEN_BUSSES,
-     "Flatten busses: %s"},
-    {"AddGlobal", ID_ADD_GLOBAL, &ConfigRecord::add_global, NODE_ADD_GLOBAL,
-     "Add .GLOBAL directive: %s"},
-    {"AddDcSources", ID_ADD_DC_SOURCES, &ConfigRecord::add_dc_sources, NODE_ADD_DC_SOURCES,
-     "Add DC sources: %s"},
-    {"OpenConfigDialog", ID_OPEN_CONFIG_DIALOG, &ConfigRecord::open_config_dialog,
-     NODE_OPEN_CONFIG_DIALOG, "Open configuration tool: %s"},
-    {"BackupNetlist", ID_BACKUP_NETLIST, &ConfigRecord::create_backup_file, NODE_BACKUP_NETLIST,
-     "Backup netlist: %s"},
-    {"ShowNetlist", ID_SHOW_NETLIST, &ConfigRecord::show_nsx, NODE_SHOW_NETLIST,
-     "Show netlist: %s"},
-    {"ShowPattern", ID_SHOW_PATTERN, &ConfigRecord::show_pat, NODE_SHOW_PATTERN,
-     "Show pattern: %s"},
-    {"RunOrvik", ID_RUN_ORVIK, &ConfigRecord::run_orvik, NODE_RUN_ORVIK, "Run ORVIK: %s"},
-    {"LoadCircuit", ID_LOAD_CIRCUIT, &ConfigRecord::load_circuit, NODE_LOAD_CIRCUIT,
-     "Load circuit: %s"},
-    {"SpiceAddPrefix", ID_SPICE_ADD_PREFIX, &ConfigRecord::add_always_prefix, NODE_SPICE_ADD_PREFIX,
-     "Add prefix: %s"},
-    {"SpiceAddUnit", ID_SPICE_ADD_UNIT, &ConfigRecord::add_unit, NODE_SPICE_ADD_UNIT,
-     "Add units: %s"},
-    {"SpiceAddMosFactor", ID_SPICE_ADD_MOS_FACTOR, &ConfigRecord::add_mos_multi_prefix,
-     NODE_SPICE_ADD_MOS_FACTOR, "Add MOS factors: %s"},
-};
-
-class CheckBoxes : public PageTest, public testing::WithParamInterface<CheckBoxCase>
+// Leaves in a chooser the path a user's choice would.
+struct Chosen : wxDirDialog
 {
-};
-
-TEST_P(CheckBoxes, WriteTheFieldAndRewriteOnlyTheirNode)
-{
-    const CheckBoxCase& c = GetParam();
-    SelectPageOf(c.node);
-    const bool initial = Record().*c.field;
-    auto* box = m_frame->FindCtrl<wxCheckBox>(c.id);
-    ASSERT_NE(box, nullptr);
-    ASSERT_EQ(box->GetValue(), initial) << "page not loaded";
-
-    const auto before = Labels();
-    for (const bool value : {!initial, initial})
+    // On GTK, wxDirDialog::SetPath only moves the native chooser; GetPath returns the path the
+    // user accepted, which the dialog keeps in its base class.
+    static void Set(wxDirDialog& d, const wxString& path) { d.*(&Chosen::m_path) = path; }
+    // GTK's file chooser takes a path only once it has read the folder, and an open dialog only
+    // a file that exists: wx's own wxExpectModal<wxFileDialog> leaves GetPath empty there.
+    static void Set(wxFileDialog& d, const wxString& path)
     {
-        Click(c.id, value);
-        EXPECT_EQ(Record().*c.field, value);
-        EXPECT_FALSE(Record().saved);
-        const auto after = Labels();
-        if (value == initial)
-            ExpectSameLabels(before, after);
-        else
-            ExpectOnlyLabelChanged(before, after, Node(c.node), YesNoLabel(c.format, value));
+        d.SetPath(path);
+        for (const wxStopWatch clock; d.GetPath() != path && clock.Time() < 5000;)
+            wxYield();
+    }
+};
+
+// Answers a library chooser; wx's test hook cannot answer either of them with a path.
+template <class Dialog> struct Answer : wxExpectModalBase<Dialog, Answer<Dialog>>
+{
+    Answer(const wxString& path, int id) : path(path), id(id) {}
+    int OnInvoked(Dialog* dialog) const override
+    {
+        if (id == wxID_OK)
+            Chosen::Set(*dialog, path);
+        return id;
+    }
+    wxString path;
+    int id;
+};
+
+class OptionPage : public FrameTest
+{
+  protected:
+    ConfigRecord& Rec() { return m_frame->Config(); }
+    wxTreeItemId Node(int page) const
+    {
+        return ConfigFrame::FindNodeByPageId(m_frame->Tree(), page, m_frame->Tree()->GetRootItem());
+    }
+    // As a user's click would: shows the node's page.
+    void Show(int page) { m_frame->Tree()->SelectItem(Node(page)); }
+    // Leaves out the children of `refilled`.
+    Labels Tree(int refilled = PAGE_ID_NONE) const
+    {
+        Labels out;
+        Walk(m_frame->Tree(), m_frame->Tree()->GetRootItem(),
+             refilled ? Node(refilled) : wxTreeItemId(), out);
+        return out;
+    }
+    Labels With(Labels labels, int page, const std::string& label) const
+    {
+        EXPECT_EQ(labels.count(Node(page).GetID()), 1u) << "no node " << page;
+        labels[Node(page).GetID()] = label;
+        return labels;
+    }
+    std::vector<std::string> Children(int page) const
+    {
+        std::vector<std::string> texts;
+        wxTreeItemIdValue cookie;
+        for (auto child = m_frame->Tree()->GetFirstChild(Node(page), cookie); child.IsOk();
+             child = m_frame->Tree()->GetNextChild(Node(page), cookie))
+            texts.push_back(m_frame->Tree()->GetItemText(child).utf8_string());
+        return texts;
+    }
+
+    void ShowPaths(const LibraryPathList& paths)
+    {
+        Rec().library_paths = paths;
+        m_frame->BuildOptionTree();
+        Show(NODE_LIBRARIES);
+        Rec().saved = true;
+    }
+    // The record, the list box and node 6016 hold the same entries, and nothing is selected.
+    void ExpectPaths(const LibraryPathList& expected)
+    {
+        EXPECT_EQ(Rec().library_paths, expected);
+        EXPECT_FALSE(Rec().saved);
+        std::vector<std::string> shown, listed;
+        for (const std::string& path : expected)
+            shown.push_back(ToWx(path).utf8_string());
+        auto* list = m_frame->FindCtrl<wxListBox>(ID_LIBRARY_PATH_LIST);
+        ASSERT_NE(list, nullptr);
+        for (const wxString& text : list->GetStrings())
+            listed.push_back(text.utf8_string());
+        EXPECT_EQ(listed, shown);
+        EXPECT_EQ(list->GetSelection(), wxNOT_FOUND);
+        EXPECT_EQ(Children(NODE_LIBRARIES), shown);
+        // wx cannot expand a node without children.
+        EXPECT_EQ(m_frame->Tree()->IsExpanded(Node(NODE_LIBRARIES)), !expected.empty());
+    }
+    template <class Dialog> void Choose(int button, const std::string& path, int answer)
+    {
+        wxTEST_DIALOG(Press(button), Answer<Dialog>(wxString::FromUTF8(path), answer));
+    }
+};
+
+TEST_F(OptionPage, CheckBoxesWriteTheirFieldAndRewriteOnlyTheirNode)
+{
+    using R = ConfigRecord;
+    const std::tuple<int, bool R::*, int, const char*> boxes[] = {
+        {ID_FLATTEN_NETLIST, &R::flat, NODE_FLATTEN_NETLIST, "Flatten netlist"},
+        {ID_FLATTEN_BUSSES, &R::flat_busses, NODE_FLATTEN_BUSSES, "Flatten busses"},
+        {ID_ADD_GLOBAL, &R::add_global, NODE_ADD_GLOBAL, "Add .GLOBAL directive"},
+        {ID_ADD_DC_SOURCES, &R::add_dc_sources, NODE_ADD_DC_SOURCES, "Add DC sources"},
+        {ID_OPEN_CONFIG_DIALOG, &R::open_config_dialog, NODE_OPEN_CONFIG_DIALOG,
+         "Open configuration tool"},
+        {ID_BACKUP_NETLIST, &R::create_backup_file, NODE_BACKUP_NETLIST, "Backup netlist"},
+        {ID_SHOW_NETLIST, &R::show_nsx, NODE_SHOW_NETLIST, "Show netlist"},
+        {ID_SHOW_PATTERN, &R::show_pat, NODE_SHOW_PATTERN, "Show pattern"},
+        {ID_RUN_ORVIK, &R::run_orvik, NODE_RUN_ORVIK, "Run ORVIK"},
+        {ID_LOAD_CIRCUIT, &R::load_circuit, NODE_LOAD_CIRCUIT, "Load circuit"},
+        {ID_SPICE_ADD_PREFIX, &R::add_always_prefix, NODE_SPICE_ADD_PREFIX, "Add prefix"},
+        {ID_SPICE_ADD_UNIT, &R::add_unit, NODE_SPICE_ADD_UNIT, "Add units"},
+        {ID_SPICE_ADD_MOS_FACTOR, &R::add_mos_multi_prefix, NODE_SPICE_ADD_MOS_FACTOR,
+         "Add MOS factors"}};
+    for (const auto& [id, field, node, label] : boxes)
+    {
+        SCOPED_TRACE(label);
+        Show(node);
+        wxWindow* box = m_frame->FindWindow(id);
+        ASSERT_TRUE(box && box->IsShownOnScreen()) << "not on the page of its node";
+        const bool initial = Rec().*field;
+        const Labels before = Tree();
+        for (const bool value : {!initial, initial})
+        {
+            Rec().saved = true;
+            Click(id, value);
+            EXPECT_EQ(Rec().*field, value);
+            EXPECT_FALSE(Rec().saved);
+            EXPECT_EQ(Tree(), With(before, node, std::string(label) + (value ? ": Yes" : ": No")));
+        }
     }
 }
 
-INSTANTIATE_TEST_SUITE_P(Pages, CheckBoxes, testing::ValuesIn(CHECK_BOXES),
-                         [](const auto& info) { return std::string(info.param.name); });
-
-// A check box whose flag enables another control of the common page.
-struct EnablingCase
+TEST_F(OptionPage, DependentControlsFollowTheirFlagAtOnceAndKeepTheirValue)
 {
-    const char* name;
-    int flag;
-    bool ConfigRecord::*field;
-    int dependent;
-};
-void PrintTo(const EnablingCase& c, std::ostream* os) { *os << c.name; }
-
-class Enabling : public PageTest, public testing::WithParamInterface<EnablingCase>
-{
-};
-
-TEST_P(Enabling, DependentControlFollowsTheFlagAtOnce)
-{
-    const EnablingCase& c = GetParam();
-    Record().backup_extension = ".old";
-    Record().load_circuit = true;
+    Rec().backup_extension = ".old";
+    Rec().load_circuit = true;
     m_frame->BuildOptionTree();
-    SelectPageOf(NODE_OPEN_CONFIG_DIALOG);
-    wxWindow* dependent = m_frame->FindWindow(c.dependent);
-    ASSERT_NE(dependent, nullptr);
-    const bool initial = Record().*c.field;
-    EXPECT_EQ(dependent->IsEnabled(), initial);
-    wxWindow* flag = m_frame->FindWindow(c.flag);
-    flag->SetFocus();
-    wxYield();
-    ASSERT_EQ(wxWindow::FindFocus(), flag);
-
-    for (const bool value : {!initial, initial, !initial})
+    Show(NODE_OPEN_CONFIG_DIALOG);
+    const std::tuple<int, bool ConfigRecord::*, int> flags[] = {
+        {ID_BACKUP_NETLIST, &ConfigRecord::create_backup_file, ID_BACKUP_EXTENSION},
+        {ID_RUN_ORVIK, &ConfigRecord::run_orvik, ID_LOAD_CIRCUIT}};
+    for (const auto& [flagId, field, dependentId] : flags)
     {
-        Click(c.flag, value);
+        wxWindow* flag = m_frame->FindWindow(flagId);
+        wxWindow* dependent = m_frame->FindWindow(dependentId);
+        ASSERT_TRUE(flag && dependent);
+        const bool initial = Rec().*field;
+        EXPECT_EQ(dependent->IsEnabled(), initial);
+        flag->SetFocus();
         wxYield();
-        EXPECT_EQ(dependent->IsEnabled(), value);
-        EXPECT_TRUE(m_frame->FindWindow(ID_PAGE_COMMON)->IsShown());
-        // Re-showing the page must not take the focus from the box the user is on.
-        EXPECT_EQ(wxWindow::FindFocus(), flag);
+        ASSERT_EQ(wxWindow::FindFocus(), flag);
+        for (const bool value : {!initial, initial})
+        {
+            Click(flagId, value);
+            wxYield();
+            EXPECT_EQ(dependent->IsEnabled(), value) << dependentId;
+            EXPECT_TRUE(dependent->IsShownOnScreen());
+            EXPECT_EQ(wxWindow::FindFocus(), flag) << "re-showing the page took the focus";
+        }
     }
-    // Disabling shows the value; it does not change it.
-    EXPECT_EQ(Record().backup_extension, ".old");
-    EXPECT_TRUE(Record().load_circuit);
+    EXPECT_EQ(Rec().backup_extension, ".old");
+    EXPECT_TRUE(Rec().load_circuit);
     EXPECT_EQ(m_frame->FindCtrl<wxComboBox>(ID_BACKUP_EXTENSION)->GetValue(), ".old");
     EXPECT_TRUE(m_frame->FindCtrl<wxCheckBox>(ID_LOAD_CIRCUIT)->GetValue());
-    EXPECT_EQ(NodeUtf8(NODE_BACKUP_EXTENSION), "Backup extention: \".old\"");
-    EXPECT_EQ(NodeUtf8(NODE_LOAD_CIRCUIT), "Load circuit: Yes");
 }
 
-INSTANTIATE_TEST_SUITE_P(CommonPage, Enabling,
-                         testing::Values(EnablingCase{"BackupExtension", ID_BACKUP_NETLIST,
-                                                      &ConfigRecord::create_backup_file,
-                                                      ID_BACKUP_EXTENSION},
-                                         EnablingCase{"LoadCircuit", ID_RUN_ORVIK,
-                                                      &ConfigRecord::run_orvik, ID_LOAD_CIRCUIT}),
-                         [](const auto& info) { return std::string(info.param.name); });
-
-struct LanguageCase
+TEST_F(OptionPage, LanguageBoxesRefillNetlistTypeWithTheAllowedLanguages)
 {
-    const char* name;
-    bool spice, verilog, vhdl;
-    std::vector<std::string> children;
-};
-void PrintTo(const LanguageCase& c, std::ostream* os) { *os << c.name; }
-
-class Languages : public PageTest, public testing::WithParamInterface<LanguageCase>
-{
-};
-
-TEST_P(Languages, NetlistTypeListsTheAllowedLanguages)
-{
-    const LanguageCase& c = GetParam();
-    SelectPageOf(NODE_FLATTEN_BUSSES);
-    const auto before = Labels(NODE_NETLIST_TYPE);
-    // Tick the boxes to set, then clear the others: every step goes through its own handler.
-    const std::pair<int, bool> clicks[] = {
-        {ID_ALLOW_SPICE, c.spice}, {ID_ALLOW_VERILOG, c.verilog}, {ID_ALLOW_VHDL, c.vhdl}};
-    for (const bool pass : {true, false})
-        for (const auto& [id, value] : clicks)
-            if (value == pass)
-                Click(id, value);
-
-    EXPECT_EQ(Record().spice, c.spice);
-    EXPECT_EQ(Record().verilog, c.verilog);
-    EXPECT_EQ(Record().vhdl, c.vhdl);
-    EXPECT_FALSE(Record().saved);
-    EXPECT_EQ(ChildTexts(NODE_NETLIST_TYPE), c.children);
-    // wx cannot expand a node without children.
-    EXPECT_EQ(OptionTree()->IsExpanded(Node(NODE_NETLIST_TYPE)), !c.children.empty());
-    ExpectSameLabels(before, Labels(NODE_NETLIST_TYPE));
-}
-
-INSTANTIATE_TEST_SUITE_P(
-    NetlistTypePage, Languages,
-    testing::Values(LanguageCase{"None", false, false, false, {}},
-                    LanguageCase{"VhdlAlone", false, false, true, {"VHDL"}},
-                    LanguageCase{"VerilogAlone", false, true, false, {"Verilog"}},
-                    LanguageCase{"SpiceAndVhdl", true, false, true, {"Spice", "VHDL"}},
-                    LanguageCase{"All", true, true, true, {"Spice", "Verilog", "VHDL"}}),
-    [](const auto& info) { return std::string(info.param.name); });
-
-struct DefaultLanguageCase
-{
-    int item;
-    char code;
-    const char* label;
-};
-void PrintTo(const DefaultLanguageCase& c, std::ostream* os) { *os << c.label; }
-
-class DefaultLanguage : public PageTest, public testing::WithParamInterface<DefaultLanguageCase>
-{
-};
-
-TEST_P(DefaultLanguage, ItemWritesItsCodeAndShortName)
-{
-    const DefaultLanguageCase& c = GetParam();
-    Record().default_orviktype = c.code == 'D' ? 'V' : 'D'; // start from another language
-    m_frame->BuildOptionTree();
-    SelectPageOf(NODE_DEFAULT_LANGUAGE);
-    const auto before = Labels();
-
-    ChooseRadio(ID_DEFAULT_LANGUAGE, c.item);
-    EXPECT_EQ(Record().default_orviktype, c.code);
-    EXPECT_FALSE(Record().saved);
-    ExpectOnlyLabelChanged(before, Labels(), Node(NODE_DEFAULT_LANGUAGE), c.label);
-}
-
-INSTANTIATE_TEST_SUITE_P(NetlistTypePage, DefaultLanguage,
-                         testing::Values(DefaultLanguageCase{0, 'A', "Default language: Spice"},
-                                         DefaultLanguageCase{1, 'D', "Default language: Verilog"},
-                                         DefaultLanguageCase{2, 'V', "Default language: VHDL"}));
-
-// Showing a page puts the record's values in its controls without anything counting as a change.
-TEST_F(PageTest, ShowingThePagesKeepsTheRecordSaved)
-{
-    Record().verilog = true;
-    Record().default_orviktype = 'V';
-    Record().flat_busses = true;
-    Record().add_dc_sources = true;
-    Record().library_paths = {"/opt/lib", "/opt/lib/cells.lib"};
-    Record().create_backup_file = true;
-    Record().backup_extension = ".old";
-    Record().run_orvik = false;
-    Record().add_unit = true;
-    m_frame->BuildOptionTree();
-    Record().saved = true;
-
-    for (const int node : {NODE_FLATTEN_BUSSES, NODE_LIBRARIES, NODE_BACKUP_EXTENSION,
-                           NODE_SPICE_ADD_UNIT, NODE_DEFAULT_LANGUAGE, NODE_RUN_ORVIK})
+    Show(NODE_FLATTEN_BUSSES);
+    const std::pair<std::vector<bool>, std::vector<std::string>> cases[] = {
+        {{false, false, false}, {}},
+        {{false, false, true}, {"VHDL"}},
+        {{false, true, false}, {"Verilog"}},
+        {{true, false, true}, {"Spice", "VHDL"}},
+        {{true, true, true}, {"Spice", "Verilog", "VHDL"}}};
+    const int ids[] = {ID_ALLOW_SPICE, ID_ALLOW_VERILOG, ID_ALLOW_VHDL};
+    for (const auto& [allowed, children] : cases)
     {
-        SelectPageOf(node);
-        wxYield();
-        EXPECT_TRUE(Record().saved) << "showing the page of node " << node;
+        Rec().saved = true;
+        const Labels before = Tree(NODE_NETLIST_TYPE);
+        // Ticks first, then clears: every box goes through its own handler.
+        for (const bool pass : {true, false})
+            for (size_t i = 0; i < 3; ++i)
+                if (allowed[i] == pass)
+                    Click(ids[i], pass);
+        EXPECT_EQ((std::vector<bool>{Rec().spice, Rec().verilog, Rec().vhdl}), allowed);
+        EXPECT_FALSE(Rec().saved);
+        EXPECT_EQ(Children(NODE_NETLIST_TYPE), children);
+        // wx cannot expand a node without children.
+        EXPECT_EQ(m_frame->Tree()->IsExpanded(Node(NODE_NETLIST_TYPE)), !children.empty());
+        EXPECT_EQ(Tree(NODE_NETLIST_TYPE), before);
     }
-    EXPECT_EQ(m_frame->FindCtrl<wxRadioBox>(ID_DEFAULT_LANGUAGE)->GetSelection(), 2);
-    EXPECT_EQ(m_frame->FindCtrl<wxComboBox>(ID_BACKUP_EXTENSION)->GetValue(), ".old");
-    EXPECT_FALSE(m_frame->FindWindow(ID_LOAD_CIRCUIT)->IsEnabled());
-    EXPECT_TRUE(m_frame->FindCtrl<wxCheckBox>(ID_SPICE_ADD_UNIT)->GetValue());
 }
 
-// Whatever the box holds is stored as it is, an emptied box as empty text.
-class BackupExtension : public PageTest, public testing::WithParamInterface<const char*>
+TEST_F(OptionPage, DefaultLanguageItemsWriteTheirCodeAndLabel)
 {
-};
-
-TEST_P(BackupExtension, StoresTheTextAsItIs)
-{
-    const std::string text = GetParam();
-    SelectPageOf(NODE_BACKUP_EXTENSION);
-    const auto before = Labels();
-    TypeText(ID_BACKUP_EXTENSION, wxString::FromUTF8(text));
-    EXPECT_EQ(Record().backup_extension, text);
-    EXPECT_FALSE(Record().saved);
-    ExpectOnlyLabelChanged(before, Labels(), Node(NODE_BACKUP_EXTENSION),
-                           wxString::FromUTF8("Backup extention: \"" + text + "\""));
+    Show(NODE_DEFAULT_LANGUAGE);
+    // Starting from another item each time.
+    const std::tuple<int, char, const char*> items[] = {
+        {1, 'D', "Verilog"}, {2, 'V', "VHDL"}, {0, 'A', "Spice"}};
+    for (const auto& [item, code, name] : items)
+    {
+        Rec().saved = true;
+        const Labels before = Tree();
+        ChooseRadio(ID_DEFAULT_LANGUAGE, item);
+        EXPECT_EQ(Rec().default_orviktype, code);
+        EXPECT_FALSE(Rec().saved);
+        EXPECT_EQ(Tree(),
+                  With(before, NODE_DEFAULT_LANGUAGE, std::string("Default language: ") + name));
+    }
 }
 
-INSTANTIATE_TEST_SUITE_P(CommonPage, BackupExtension,
-                         testing::Values("", "old", " sauvegard\xc3\xa9", ".bak.1"));
-
-// Real keystrokes into the focused box: each one is stored, and the caret stays where the user
-// is typing. A handler that reloaded the box would move the caret to the start.
-TEST_F(PageTest, KeystrokesInTheExtensionBoxAreStoredOneByOneAndKeepFocusAndCaret)
+// Real keystrokes into the focused box. A handler that reloaded the box would move the caret.
+TEST_F(OptionPage, ExtensionBoxStoresEachKeystrokeAndKeepsFocusAndCaret)
 {
-    Record().create_backup_file = true;
-    Record().backup_extension = "";
+    Rec().create_backup_file = true;
+    Rec().backup_extension = "";
     m_frame->BuildOptionTree();
-    SelectPageOf(NODE_BACKUP_EXTENSION);
+    Show(NODE_BACKUP_EXTENSION);
     auto* box = m_frame->FindCtrl<wxComboBox>(ID_BACKUP_EXTENSION);
-    ASSERT_NE(box, nullptr);
-    ASSERT_TRUE(box->IsEnabled());
+    ASSERT_TRUE(box && box->IsEnabled());
     box->SetFocus();
     wxYield();
     ASSERT_EQ(wxWindow::FindFocus(), box);
-
+    const Labels before = Tree();
     wxUIActionSimulator keys;
     const std::string typed = ".bak";
-    for (size_t i = 0; i < typed.size(); ++i)
+    for (size_t i = 1; i <= typed.size(); ++i)
     {
-        keys.Char(typed[i]);
+        Rec().saved = true;
+        keys.Char(typed[i - 1]);
         wxYield();
-        const std::string sofar = typed.substr(0, i + 1);
-        EXPECT_EQ(Record().backup_extension, sofar);
-        EXPECT_EQ(box->GetValue(), sofar);
-        EXPECT_EQ(box->GetInsertionPoint(), box->GetLastPosition());
+        EXPECT_EQ(Rec().backup_extension, typed.substr(0, i));
+        EXPECT_FALSE(Rec().saved);
+        EXPECT_EQ(box->GetInsertionPoint(), long(i));
         EXPECT_EQ(wxWindow::FindFocus(), box);
     }
-    EXPECT_FALSE(Record().saved);
-    EXPECT_EQ(NodeUtf8(NODE_BACKUP_EXTENSION), "Backup extention: \".bak\"");
-
-    box->SetInsertionPoint(1);
-    keys.Char('o');
-    wxYield();
-    EXPECT_EQ(Record().backup_extension, ".obak");
-    EXPECT_EQ(box->GetInsertionPoint(), 2);
-    EXPECT_EQ(wxWindow::FindFocus(), box);
-
-    keys.Char(WXK_DOWN); // picks the list's only item, which arrives as a text event
-    wxYield();
-    EXPECT_EQ(Record().backup_extension, ".bak");
-    EXPECT_EQ(NodeUtf8(NODE_BACKUP_EXTENSION), "Backup extention: \".bak\"");
+    EXPECT_EQ(Tree(), With(before, NODE_BACKUP_EXTENSION, "Backup extention: \".bak\""));
+    // Stored as typed, an emptied box as empty text.
+    for (const char* text : {" sauvegard\xc3\xa9", ""})
+    {
+        TypeText(ID_BACKUP_EXTENSION, wxString::FromUTF8(text));
+        EXPECT_EQ(Rec().backup_extension, text);
+        EXPECT_EQ(NodeText(NODE_BACKUP_EXTENSION).utf8_string(),
+                  std::string("Backup extention: \"") + text + "\"");
+    }
 }
 
-// A control on the wrong panel would show on another page.
-TEST_F(PageTest, EveryControlSitsOnItsPage)
+TEST_F(OptionPage, ChoosersAddOnlyAConfirmedPathNotShownYet)
 {
-    const std::pair<int, std::vector<int>> pages[] = {
-        {ID_PAGE_NETLIST_TYPE,
-         {ID_ALLOW_SPICE, ID_ALLOW_VERILOG, ID_ALLOW_VHDL, ID_DEFAULT_LANGUAGE, ID_FLATTEN_NETLIST,
-          ID_FLATTEN_BUSSES}},
-        {ID_PAGE_PATTERN,
-         {ID_ADD_GLOBAL, ID_ADD_DC_SOURCES, ID_LIBRARY_PATH_LIST, ID_ADD_LIBRARY_PATH,
-          ID_ADD_LIBRARY_FILE, ID_REMOVE_LIBRARY_PATH}},
-        {ID_PAGE_COMMON,
-         {ID_OPEN_CONFIG_DIALOG, ID_BACKUP_NETLIST, ID_BACKUP_EXTENSION, ID_SHOW_NETLIST,
-          ID_SHOW_PATTERN, ID_RUN_ORVIK, ID_LOAD_CIRCUIT}},
-        {ID_PAGE_SPICE, {ID_SPICE_ADD_PREFIX, ID_SPICE_ADD_UNIT, ID_SPICE_ADD_MOS_FACTOR}}};
-    for (const auto& [page, ids] : pages)
-        for (const int id : ids)
-        {
-            wxWindow* control = m_frame->FindWindow(id);
-            ASSERT_NE(control, nullptr) << id;
-            EXPECT_EQ(control->GetParent()->GetId(), page) << id;
-        }
-    auto* language = m_frame->FindCtrl<wxRadioBox>(ID_DEFAULT_LANGUAGE);
-    ASSERT_EQ(language->GetCount(), 3u);
-    EXPECT_EQ(language->GetString(2), "VHDL / VHDL-AMS");
-    auto* extension = m_frame->FindCtrl<wxComboBox>(ID_BACKUP_EXTENSION);
-    EXPECT_EQ(extension->GetCount(), 1u);
-    EXPECT_EQ(extension->GetString(0), ".bak");
+    // The file chooser needs real files.
+    char dir[] = "/tmp/zidovade-libs-XXXXXX";
+    ASSERT_NE(mkdtemp(dir), nullptr);
+    const std::string in = std::string(dir) + "/";
+    for (const char* name : {"cells.lib", "Cells.lib"})
+        std::ofstream(in + name) << "* library\n";
+    const LibraryPathList listed = {"/opt/biblioth\xe8que", in + "cells.lib"}; // Latin-1 bytes
+    const std::tuple<bool, std::string, int, bool> cases[] = {
+        {true, in + "d\xc3\xa9", wxID_OK, true},
+        {true, in + "other", wxID_CANCEL, false},
+        {true, "/opt/biblioth\xc3\xa8que", wxID_OK, false},
+        {false, in + "Cells.lib", wxID_OK, true},
+        {false, in + "Cells.lib", wxID_CANCEL, false},
+        {false, in + "cells.lib", wxID_OK, false}};
+    for (const auto& [isDir, path, answer, added] : cases)
+    {
+        SCOPED_TRACE(path);
+        ShowPaths(listed);
+        const Labels before = Tree(NODE_LIBRARIES);
+        isDir ? Choose<wxDirDialog>(ID_ADD_LIBRARY_PATH, path, answer)
+              : Choose<wxFileDialog>(ID_ADD_LIBRARY_FILE, path, answer);
+        LibraryPathList expected = listed;
+        if (added)
+            expected.push_back(path);
+        ExpectPaths(expected);
+        EXPECT_EQ(Tree(NODE_LIBRARIES), before);
+    }
+    std::filesystem::remove_all(dir);
 }
 
-TEST_F(PageTest, ChangeIsStoredWhenItsNodeIsNotInTheTree)
+TEST_F(OptionPage, RemoveTakesTheFirstEntryShownAsTheSelection)
 {
-    SelectPageOf(NODE_SPICE_ADD_UNIT);
-    OptionTree()->Delete(Node(NODE_SPICE_ADD_UNIT));
-    const auto before = Labels();
-    Click(ID_SPICE_ADD_UNIT, true);
-    EXPECT_TRUE(Record().add_unit);
-    EXPECT_FALSE(Record().saved);
-    ExpectSameLabels(before, Labels());
+    const std::tuple<LibraryPathList, int, LibraryPathList> cases[] = {
+        {{"/a"}, 0, {}},
+        {{"/a", "/b"}, wxNOT_FOUND, {"/a", "/b"}},
+        // Two equal entries can only come from a file.
+        {{"/x", "/dup", "/y", "/dup"}, 3, {"/x", "/y", "/dup"}},
+        {{"/opt/biblioth\xe8que", "/opt/lib"}, 0, {"/opt/lib"}}};
+    for (const auto& [paths, selected, expected] : cases)
+    {
+        ShowPaths(paths);
+        m_frame->FindCtrl<wxListBox>(ID_LIBRARY_PATH_LIST)->SetSelection(selected);
+        const Labels before = Tree(NODE_LIBRARIES);
+        Press(ID_REMOVE_LIBRARY_PATH);
+        ExpectPaths(expected);
+        EXPECT_EQ(Tree(NODE_LIBRARIES), before);
+    }
+}
+
+TEST_F(OptionPage, SelectedLibraryPathShowsInTheStatusBar)
+{
+    ShowPaths({"/opt/lib", "/opt/cells.lib"});
+    const Labels before = Tree();
+    auto* list = m_frame->FindCtrl<wxListBox>(ID_LIBRARY_PATH_LIST);
+    wxCommandEvent event(wxEVT_LISTBOX, ID_LIBRARY_PATH_LIST);
+    event.SetEventObject(list);
+    event.SetString(list->GetString(1));
+    list->HandleWindowEvent(event);
+    EXPECT_EQ(StatusText(), "/opt/cells.lib");
+    EXPECT_FALSE(Rec().saved);
+    EXPECT_EQ(Tree(), before);
 }
 
 } // namespace
