@@ -1,20 +1,21 @@
 #pragma once
 
 // Tests of the ways the record reaches a file: a window with a scratch folder, the program's
-// questions answered in order through wx's modal test hook, and the file read back.
+// dialogs answered in order through wx's modal test hook, and the file read back.
 #include "tests/gui/gui_test.h"
 
 #include "config/ini_file.h"
 
 #include <wx/app.h>
 #include <wx/fileconf.h>
+#include <wx/filedlg.h>
+#include <wx/msgdlg.h>
 #include <wx/toolbar.h>
 
 #include <csignal>
 #include <filesystem>
 #include <fstream>
 #include <functional>
-#include <memory>
 #include <sys/resource.h>
 #include <vector>
 
@@ -24,106 +25,66 @@ inline const char* const CLOSE_QUESTION = "Do you want save your configuration b
 inline const char* const GENERATE_QUESTION =
     "Do you want save your new configuration before netlisting?";
 
-// A question of the program: its text, caption "Save", Yes, No and Cancel, no icon asked for.
-class QuestionExpected : public wxExpectModalBase<wxMessageDialog, QuestionExpected>
+// One dialog as the program must show it, over the main window, and the answer it gets: a
+// question (caption "Save", Yes, No and Cancel, no icon asked for) or a file chooser (its title,
+// the INI wildcard, exactly the style asked for) that returns the given path.
+class Dialog : public wxModalExpectation
 {
   public:
-    QuestionExpected(const wxString& text, int answer) : m_text(text), m_answer(answer) {}
-
-  protected:
-    int OnInvoked(wxMessageDialog* dialog) const override
-    {
-        EXPECT_EQ(dialog->GetMessage(), m_text);
-        EXPECT_EQ(dialog->GetCaption(), "Save");
-        EXPECT_EQ(dialog->GetMessageDialogStyle(), wxYES_NO | wxCANCEL);
-        EXPECT_NE(dynamic_cast<ConfigFrame*>(dialog->GetParent()), nullptr);
-        return m_answer;
-    }
-    wxString GetDefaultDescription() const override { return "question \"" + m_text + "\""; }
-
-  private:
-    wxString m_text;
-    int m_answer;
-};
-
-// The program's file chooser: title, the INI wildcard and exactly the style asked for.
-class FileExpected : public wxExpectModalBase<wxFileDialog, FileExpected>
-{
-  public:
-    FileExpected(long style, const wxString& path, int answer)
-        : m_style(style), m_path(path), m_answer(answer)
+    Dialog(long style, const wxString& text, int answer, const std::string& path = "")
+        : m_style(style), m_text(text), m_answer(answer), m_path(path)
     {
     }
 
   protected:
-    int OnInvoked(wxFileDialog* dialog) const override
+    int Invoke(wxDialog* dialog) const override
     {
-        EXPECT_EQ(dialog->GetMessage(),
-                  m_style == wxFD_OPEN ? "Open a Configuration File" : "Save a Configuration File");
-        EXPECT_EQ(dialog->GetWildcard(), "INI files (*.ini)|*.ini");
-        EXPECT_EQ(dialog->GetWindowStyle(), m_style);
         EXPECT_NE(dynamic_cast<ConfigFrame*>(dialog->GetParent()), nullptr);
-        dialog->SetPath(m_path);
-        return m_answer;
+        auto* question = dynamic_cast<wxMessageDialog*>(dialog);
+        auto* chooser = dynamic_cast<wxFileDialog*>(dialog);
+        if (question)
+        {
+            EXPECT_EQ(question->GetMessage(), m_text);
+            EXPECT_EQ(question->GetCaption(), "Save");
+            EXPECT_EQ(question->GetMessageDialogStyle(), m_style);
+        }
+        else if (chooser)
+        {
+            EXPECT_EQ(chooser->GetMessage(), m_text);
+            EXPECT_EQ(chooser->GetWildcard(), "INI files (*.ini)|*.ini");
+            EXPECT_EQ(chooser->GetWindowStyle(), m_style);
+            chooser->SetPath(m_path);
+        }
+        return question || chooser ? m_answer : wxID_NONE;
     }
-    wxString GetDefaultDescription() const override
-    {
-        return m_style == wxFD_OPEN ? "open file dialog" : "save file dialog";
-    }
+    wxString GetDefaultDescription() const override { return "dialog \"" + m_text + "\""; }
 
   private:
     long m_style;
-    wxString m_path;
+    wxString m_text;
     int m_answer;
+    std::string m_path;
 };
 
-// Reports an unexpected dialog like the shared hook and then cancels it: left to the toolkit it
-// would wait for a user who never comes.
-class ScriptHook : public FailingModalHook
+inline Dialog Question(const char* text, int answer) { return {wxYES_NO | wxCANCEL, text, answer}; }
+inline Dialog OpenFile(const std::string& path, int answer = wxID_OK)
 {
-  public:
-    using FailingModalHook::FailingModalHook;
-
-  protected:
-    int Enter(wxDialog* dialog) override
-    {
-        const int answer = FailingModalHook::Enter(dialog);
-        return answer == wxID_NONE ? wxID_CANCEL : answer;
-    }
-};
-
-// The dialogs one action must show, in order, with their answers; any other dialog, or one
-// missing, fails the test.
-class DialogScript
+    return Dialog(wxFD_OPEN, "Open a Configuration File", answer, path);
+}
+inline Dialog SaveFile(const std::string& path, int answer = wxID_OK)
 {
-  public:
-    DialogScript& Question(const wxString& text, int answer)
-    {
-        m_expected.push_back(std::make_shared<QuestionExpected>(text, answer));
-        return *this;
-    }
-    DialogScript& OpenFile(const std::filesystem::path& path, int answer = wxID_OK)
-    {
-        m_expected.push_back(std::make_shared<FileExpected>(wxFD_OPEN, path.string(), answer));
-        return *this;
-    }
-    DialogScript& SaveFile(const std::filesystem::path& path, int answer = wxID_OK)
-    {
-        m_expected.push_back(std::make_shared<FileExpected>(wxFD_SAVE, path.string(), answer));
-        return *this;
-    }
-    void Run(const std::function<void()>& action) const
-    {
-        ScriptHook hook(__FILE__, __LINE__, __func__);
-        for (const auto& expected : m_expected)
-            hook.AddExpectation(*expected);
-        action();
-        hook.CheckUnmetExpectations();
-    }
+    return Dialog(wxFD_SAVE, "Save a Configuration File", answer, path);
+}
 
-  private:
-    std::vector<std::shared_ptr<wxModalExpectation>> m_expected;
-};
+// The dialogs one action must show, in order; any other dialog, or one missing, fails the test.
+inline void WithDialogs(const std::vector<Dialog>& dialogs, const std::function<void()>& action)
+{
+    FailingModalHook hook(__FILE__, __LINE__, __func__);
+    for (const Dialog& dialog : dialogs)
+        hook.AddExpectation(dialog);
+    action();
+    hook.CheckUnmetExpectations();
+}
 
 inline void Put(const std::filesystem::path& path, const std::string& bytes)
 {
@@ -140,12 +101,10 @@ inline std::string Slurp(const std::filesystem::path& path)
 class WritesFail
 {
   public:
-    WritesFail()
+    WritesFail() : m_handler(signal(SIGXFSZ, SIG_IGN))
     {
         getrlimit(RLIMIT_FSIZE, &m_saved);
-        m_handler = signal(SIGXFSZ, SIG_IGN);
-        struct rlimit small = m_saved;
-        small.rlim_cur = 16;
+        const struct rlimit small = {16, m_saved.rlim_max};
         setrlimit(RLIMIT_FSIZE, &small);
     }
     ~WritesFail()
@@ -155,9 +114,15 @@ class WritesFail
     }
 
   private:
-    struct rlimit m_saved;
     void (*m_handler)(int);
+    struct rlimit m_saved;
 };
+
+// A configuration as another program may have left it: comments, a key and a group the tool does
+// not carry, no final line end. Any rewrite changes its bytes.
+inline const std::string HAND_WRITTEN = "; kept by hand\r\n[Defaults]\r\nspice=yes\r\n"
+                                        "flat_busses=no\r\nunknown_key=1\r\ngenerate=no\r\n"
+                                        "[Foreign]\r\nx=1\r\n[Verilog]\r\ncase=L";
 
 class FileFrameTest : public FrameTest
 {
@@ -168,11 +133,11 @@ class FileFrameTest : public FrameTest
         char pattern[] = "/tmp/zidovade_gui.XXXXXX";
         ASSERT_NE(mkdtemp(pattern), nullptr);
         m_dir = pattern;
+        Put(Path("plain"), "a file, not a folder"); // a folder no file can be written into
     }
     void TearDown() override
     {
-        std::error_code ignored;
-        std::filesystem::remove_all(m_dir, ignored);
+        std::filesystem::remove_all(m_dir);
         if (Closed())
             wxTheApp->ProcessIdle(); // deletes the destroyed window
         else
@@ -181,35 +146,32 @@ class FileFrameTest : public FrameTest
 
     // The window asked to be destroyed: it goes at the next idle time.
     bool Closed() const { return wxPendingDelete.Member(m_frame); }
-
-    std::filesystem::path Path(const char* name) const { return m_dir / name; }
+    std::string Path(const std::string& name) const { return (m_dir / name).string(); }
     // A value as the netlister finds it in the file; "-" when the key is not there.
-    static std::string InFile(const std::filesystem::path& path, const char* key)
+    static std::string InFile(const std::string& path, const char* key)
     {
-        const auto ini = ParseIni(Slurp(path));
-        return ini->Read(wxString("/Defaults/") + key, "-").ToStdString();
+        return ParseIni(Slurp(path))->Read(wxString("/Defaults/") + key, "-").ToStdString();
     }
 
-    // The file as start-up loads it.
-    void Load(const std::filesystem::path& path)
+    // The file as start-up loads it, then an option changed on a page: the record holds it and
+    // is no longer saved.
+    void LoadAndChange(const std::string& path, bool change = true)
     {
-        ASSERT_TRUE(m_frame->LoadConfig(path.string()));
+        Put(path, HAND_WRITTEN);
+        ASSERT_TRUE(m_frame->LoadConfig(path));
         m_frame->GetToolBar()->EnableTool(ID_TOOL_GENERATE, true);
-    }
-    // An option changed on a page: the record holds it and is no longer saved.
-    void Change()
-    {
-        m_frame->Config().flat_busses = true;
-        m_frame->Config().saved = false;
+        m_frame->Config().flat_busses = change;
+        m_frame->Config().saved = !change;
     }
     // A tool pressed as the toolkit reports a click.
     void Tool(int id) { m_frame->GetToolBar()->OnLeftClick(id, false); }
+    // A status text; "%s" stands for the scratch folder.
+    wxString Status(const char* text) const
+    {
+        wxString status(text);
+        status.Replace("%s", m_dir.string());
+        return status;
+    }
 
     std::filesystem::path m_dir;
 };
-
-// A configuration as another program may have left it: comments, a key and a group the tool does
-// not know, no final line end. Any rewrite changes its bytes.
-inline const std::string HAND_WRITTEN = "; kept by hand\r\n[Defaults]\r\nspice=yes\r\n"
-                                        "flat_busses=no\r\nunknown_key=1\r\ngenerate=no\r\n"
-                                        "[Verilog]\r\ncase=L\r\n[Generic]\r\nline0=LIBRARY ieee;";

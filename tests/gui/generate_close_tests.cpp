@@ -1,34 +1,36 @@
 #include "tests/gui/file_frame_test.h"
 
+#include <optional>
 #include <unistd.h>
 
 namespace
 {
 
-enum class Way
+namespace fs = std::filesystem;
+
+constexpr int GENERATE = ID_TOOL_GENERATE, CLOSE = 0, QUIT = ID_QUIT; // CLOSE: the close button
+
+// The record and its file before the way out.
+enum : int
 {
-    Generate,
-    Close
+    CHANGED = 1,     // an option changed since the file was loaded
+    FLAG = 2,        // Generate set the flag earlier in the record's life
+    GONE = 4,        // the file was removed after loading; the path is kept
+    NO_PATH = 8,     // no file: a save asks for a name, and the chooser is cancelled
+    BAD_PARENT = 16, // the record's file lies in a "folder" that is a regular file
+    FULL_DISK = 32,  // every write fails half way
+    UNREADABLE = 64  // the record's file exists and cannot be read, by root neither
 };
 
-struct Question
-{
-    const char* text;
-    int answer;
-};
-
-// One way out: the state before it, the questions it asks with their answers, and what it leaves.
 struct ExitCase
 {
     const char* name;
-    Way way;
-    bool changed;                    // an option changed since the file was loaded
-    bool flagSet;                    // Generate set the flag earlier in the record's life
-    bool fileGone;                   // the file was removed after loading; the path is kept
-    std::vector<Question> questions; // in the order asked
-    const char* generate;            // in the file afterwards; nullptr: not a byte changed
+    int way;
+    int state;
+    int answer;           // to the one question asked; 0: none asked
+    const char* generate; // in the file afterwards; nullptr: not a byte changed
     bool closes;
-    const char* status = nullptr; // not looked at when null
+    const char* status; // nullptr: not looked at; "%s": the scratch folder
 };
 
 class WayOut : public FileFrameTest, public testing::WithParamInterface<ExitCase>
@@ -38,272 +40,100 @@ class WayOut : public FileFrameTest, public testing::WithParamInterface<ExitCase
 TEST_P(WayOut, LeavesTheFileTheNetlisterExpects)
 {
     const ExitCase& c = GetParam();
-    const auto file = Path("netlist.ini");
-    Put(file, HAND_WRITTEN);
-    Load(file);
-    if (c.changed)
-        Change();
-    m_frame->Config().generate = c.flagSet;
-    if (c.fileGone)
-        std::filesystem::remove(file);
+    const std::string file = Path("netlist.ini");
+    LoadAndChange(file, c.state & CHANGED);
+    ConfigRecord& record = m_frame->Config();
+    record.generate = c.state & FLAG;
+    if (c.state & GONE)
+        fs::remove(file);
+    if (c.state & NO_PATH)
+        record.file_path.clear();
+    if (c.state & BAD_PARENT)
+        record.file_path = Path("plain/netlist.ini");
+    if (c.state & UNREADABLE)
+        record.file_path = "/proc/self/mem";
+    if ((c.state & UNREADABLE) && access("/proc/self/mem", R_OK) != 0)
+        GTEST_SKIP() << "no /proc";
 
-    DialogScript script;
-    for (const Question& q : c.questions)
-        script.Question(q.text, q.answer);
-    script.Run(
-        [&]
-        {
-            if (c.way == Way::Generate)
-                Tool(ID_TOOL_GENERATE);
-            else
-                m_frame->Close(); // the window's close button
-        });
+    // Generate asks its own question only about a file that is there.
+    const bool generateAsks = c.way == GENERATE && !(c.state & (GONE | NO_PATH));
+    std::vector<Dialog> dialogs;
+    if (c.answer)
+        dialogs.push_back(Question(generateAsks ? GENERATE_QUESTION : CLOSE_QUESTION, c.answer));
+    if ((c.state & NO_PATH) && c.answer == wxID_YES)
+        dialogs.push_back(SaveFile("", wxID_CANCEL));
+    {
+        std::optional<WritesFail> full;
+        if (c.state & FULL_DISK)
+            full.emplace();
+        wxCommandEvent quit(wxEVT_MENU, ID_QUIT);
+        WithDialogs(dialogs,
+                    [&]
+                    {
+                        if (c.way == GENERATE)
+                            Tool(ID_TOOL_GENERATE);
+                        else if (c.way == CLOSE)
+                            m_frame->Close();
+                        else
+                            m_frame->HandleWindowEvent(quit);
+                    });
+    }
 
-    if (!c.generate && c.fileGone)
-    {
-        EXPECT_FALSE(std::filesystem::exists(file));
-    }
-    else if (!c.generate)
-    {
-        EXPECT_EQ(Slurp(file), HAND_WRITTEN);
-    }
-    else
-    {
-        EXPECT_EQ(InFile(file, "generate"), c.generate);
-        // Rewritten from the record: with the changes, or with the file's values after No.
-        const bool keptChange =
-            c.changed && !c.questions.empty() && c.questions.back().answer == wxID_YES;
-        EXPECT_EQ(InFile(file, "flat_busses"), keptChange ? "yes" : "no");
-        EXPECT_EQ(InFile(file, "unknown_key"), "-");
-    }
     EXPECT_EQ(Closed(), c.closes);
-    if (c.status)
+    EXPECT_EQ(StatusText(), c.status ? Status(c.status) : StatusText());
+    if (!c.closes) // the changes stay for another try, and a later save must not hand over
     {
-        EXPECT_EQ(StatusText(), c.status);
+        EXPECT_EQ(m_frame->Config().flat_busses, bool(c.state & CHANGED));
+        EXPECT_EQ(m_frame->Config().saved, !(c.state & CHANGED));
+        EXPECT_EQ(m_frame->Config().generate, bool(c.state & FLAG));
     }
+    if (!c.generate)
+    {
+        EXPECT_EQ(fs::exists(file) ? Slurp(file) : "gone", c.state & GONE ? "gone" : HAND_WRITTEN);
+        return;
+    }
+    EXPECT_EQ(InFile(file, "generate"), c.generate);
+    // Rewritten from the record: with the change, or with the file's values after No.
+    const bool keptChange = (c.state & CHANGED) && c.answer == wxID_YES;
+    EXPECT_EQ(InFile(file, "flat_busses"), keptChange ? "yes" : "no");
+    EXPECT_EQ(InFile(file, "unknown_key"), "-");
 }
 
 const char* const NO_FILE = "The Configuration file does not exit";
+const char* const DISK_FULL = "Configuration %s/netlist.ini could not be saved: File too large";
+const char* const NOT_A_FOLDER =
+    "Configuration %s/plain/netlist.ini could not be saved: Not a directory";
+const char* const UNREAD = "Configuration /proc/self/mem could not be read: Input/output error";
 
-INSTANTIATE_TEST_SUITE_P(
-    Table, WayOut,
-    testing::Values(
-        ExitCase{"GenerateFlagClear", Way::Generate, false, false, false, {}, "yes", true},
-        ExitCase{"GenerateFlagSet", Way::Generate, false, true, false, {}, nullptr, true},
-        ExitCase{"GenerateChangedYes",
-                 Way::Generate,
-                 true,
-                 false,
-                 false,
-                 {{GENERATE_QUESTION, wxID_YES}},
-                 "yes",
-                 true},
-        ExitCase{"GenerateChangedNo",
-                 Way::Generate,
-                 true,
-                 false,
-                 false,
-                 {{GENERATE_QUESTION, wxID_NO}},
-                 "yes",
-                 true},
-        ExitCase{"GenerateChangedNoFlagSet",
-                 Way::Generate,
-                 true,
-                 true,
-                 false,
-                 {{GENERATE_QUESTION, wxID_NO}},
-                 nullptr,
-                 true},
-        ExitCase{"GenerateChangedCancel",
-                 Way::Generate,
-                 true,
-                 false,
-                 false,
-                 {{GENERATE_QUESTION, wxID_CANCEL}},
-                 nullptr,
-                 false,
-                 "Netlisting aborted"},
-        ExitCase{"GenerateNoFileUnchanged",
-                 Way::Generate,
-                 false,
-                 false,
-                 true,
-                 {},
-                 nullptr,
-                 true,
-                 NO_FILE},
-        ExitCase{"GenerateNoFileCloseYes",
-                 Way::Generate,
-                 true,
-                 false,
-                 true,
-                 {{CLOSE_QUESTION, wxID_YES}},
-                 "no",
-                 true},
-        ExitCase{"GenerateNoFileCloseNo",
-                 Way::Generate,
-                 true,
-                 false,
-                 true,
-                 {{CLOSE_QUESTION, wxID_NO}},
-                 nullptr,
-                 true,
-                 NO_FILE},
-        ExitCase{"GenerateNoFileCloseCancel",
-                 Way::Generate,
-                 true,
-                 false,
-                 true,
-                 {{CLOSE_QUESTION, wxID_CANCEL}},
-                 nullptr,
-                 false,
-                 NO_FILE},
-        ExitCase{"CloseUnchanged", Way::Close, false, true, false, {}, nullptr, true},
-        ExitCase{"CloseChangedYes",
-                 Way::Close,
-                 true,
-                 false,
-                 false,
-                 {{CLOSE_QUESTION, wxID_YES}},
-                 "no",
-                 true,
-                 "Configuration saved"},
-        ExitCase{"CloseChangedYesFlagSet",
-                 Way::Close,
-                 true,
-                 true,
-                 false,
-                 {{CLOSE_QUESTION, wxID_YES}},
-                 "yes",
-                 true},
-        ExitCase{"CloseChangedNo",
-                 Way::Close,
-                 true,
-                 false,
-                 false,
-                 {{CLOSE_QUESTION, wxID_NO}},
-                 nullptr,
-                 true},
-        ExitCase{"CloseChangedCancel",
-                 Way::Close,
-                 true,
-                 false,
-                 false,
-                 {{CLOSE_QUESTION, wxID_CANCEL}},
-                 nullptr,
-                 false}),
-    [](const auto& info) { return std::string(info.param.name); });
-
-TEST_F(FileFrameTest, GenerateWithoutAFileTouchesNothingAndStaysOpen)
-{
-    Change();
-    DialogScript().Run([&] { Tool(ID_TOOL_GENERATE); });
-    EXPECT_EQ(StatusText(), NO_FILE);
-    EXPECT_FALSE(Closed());
-    EXPECT_TRUE(std::filesystem::is_empty(m_dir));
-}
-
-TEST_F(FileFrameTest, GenerateCanBePressedAgainAfterCancel)
-{
-    const auto file = Path("netlist.ini");
-    Put(file, HAND_WRITTEN);
-    Load(file);
-    Change();
-    DialogScript().Question(GENERATE_QUESTION, wxID_CANCEL).Run([&] { Tool(ID_TOOL_GENERATE); });
-    DialogScript().Question(GENERATE_QUESTION, wxID_YES).Run([&] { Tool(ID_TOOL_GENERATE); });
-    EXPECT_EQ(InFile(file, "generate"), "yes");
-    EXPECT_TRUE(Closed());
-}
-
-struct FailedSaveCase
-{
-    const char* name;
-    Way way;
-    bool changed;
-    std::vector<Question> questions;
+const ExitCase WAYS[] = {
+    {"GenerateFlagClear", GENERATE, 0, 0, "yes", true, nullptr},
+    {"GenerateFlagSet", GENERATE, FLAG, 0, nullptr, true, nullptr},
+    {"GenerateChangedYes", GENERATE, CHANGED, wxID_YES, "yes", true, nullptr},
+    {"GenerateChangedNo", GENERATE, CHANGED, wxID_NO, "yes", true, nullptr},
+    {"GenerateChangedNoFlagSet", GENERATE, CHANGED | FLAG, wxID_NO, nullptr, true, nullptr},
+    {"GenerateChangedCancel", GENERATE, CHANGED, wxID_CANCEL, nullptr, false, "Netlisting aborted"},
+    {"GenerateNoFileCloseYes", GENERATE, CHANGED | GONE, wxID_YES, "no", true, nullptr},
+    {"GenerateNoFileCloseNo", GENERATE, CHANGED | GONE, wxID_NO, nullptr, true, NO_FILE},
+    {"GenerateNoFileCloseCancel", GENERATE, CHANGED | GONE, wxID_CANCEL, nullptr, false, NO_FILE},
+    {"GenerateNoPath", GENERATE, CHANGED | NO_PATH, 0, nullptr, false, NO_FILE},
+    {"CloseUnchanged", CLOSE, FLAG, 0, nullptr, true, nullptr},
+    {"CloseChangedYes", CLOSE, CHANGED, wxID_YES, "no", true, "Configuration saved"},
+    {"CloseChangedYesFlagSet", CLOSE, CHANGED | FLAG, wxID_YES, "yes", true, nullptr},
+    {"CloseChangedNo", CLOSE, CHANGED, wxID_NO, nullptr, true, nullptr},
+    {"CloseChangedCancel", CLOSE, CHANGED, wxID_CANCEL, nullptr, false, nullptr},
+    {"QuitChangedNo", QUIT, CHANGED, wxID_NO, nullptr, true, nullptr},
+    {"QuitChangedCancel", QUIT, CHANGED, wxID_CANCEL, nullptr, false, nullptr},
+    // A save that did not complete keeps the window: the netlister must not go on with a file
+    // that was not written, nor the user lose the changes.
+    {"CloseYesSaveFails", CLOSE, CHANGED | BAD_PARENT, wxID_YES, nullptr, false, NOT_A_FOLDER},
+    {"CloseYesNameCancelled", CLOSE, CHANGED | NO_PATH, wxID_YES, nullptr, false,
+     "Save not completed"},
+    {"GenerateSaveFails", GENERATE, FULL_DISK, 0, nullptr, false, DISK_FULL},
+    {"GenerateYesSaveFails", GENERATE, CHANGED | FULL_DISK, wxID_YES, nullptr, false, DISK_FULL},
+    {"GenerateNoUnreadable", GENERATE, CHANGED | UNREADABLE, wxID_NO, nullptr, false, UNREAD},
 };
 
-class FailedSaveOnTheWayOut : public FileFrameTest,
-                              public testing::WithParamInterface<FailedSaveCase>
-{
-};
-
-// The netlister must never go on with a file that was not written, nor the user lose changes.
-TEST_P(FailedSaveOnTheWayOut, KeepsWindowFileAndChanges)
-{
-    const auto file = Path("netlist.ini");
-    Put(file, HAND_WRITTEN);
-    Load(file);
-    if (GetParam().changed)
-        Change();
-    DialogScript script;
-    for (const Question& q : GetParam().questions)
-        script.Question(q.text, q.answer);
-    {
-        WritesFail full;
-        script.Run(
-            [&]
-            {
-                if (GetParam().way == Way::Generate)
-                    Tool(ID_TOOL_GENERATE);
-                else
-                    m_frame->Close();
-            });
-    }
-    EXPECT_FALSE(Closed());
-    EXPECT_EQ(Slurp(file), HAND_WRITTEN);
-    EXPECT_EQ(StatusText(),
-              "Configuration " + file.string() + " could not be saved: " + wxSysErrorMsgStr(EFBIG));
-    EXPECT_EQ(m_frame->Config().saved, !GetParam().changed);
-    EXPECT_FALSE(m_frame->Config().generate); // a later save must not hand over by surprise
-    EXPECT_EQ(m_frame->Config().flat_busses, GetParam().changed);
-}
-
-INSTANTIATE_TEST_SUITE_P(
-    Ways, FailedSaveOnTheWayOut,
-    testing::Values(FailedSaveCase{"GenerateUnchanged", Way::Generate, false, {}},
-                    FailedSaveCase{
-                        "GenerateYes", Way::Generate, true, {{GENERATE_QUESTION, wxID_YES}}},
-                    FailedSaveCase{"CloseYes", Way::Close, true, {{CLOSE_QUESTION, wxID_YES}}}),
-    [](const auto& info) { return std::string(info.param.name); });
-
-TEST_F(FileFrameTest, CloseKeepsTheWindowWhenTheSaveDialogIsCancelled)
-{
-    Change();
-    DialogScript()
-        .Question(CLOSE_QUESTION, wxID_YES)
-        .SaveFile("", wxID_CANCEL)
-        .Run([&] { m_frame->Close(); });
-    EXPECT_FALSE(Closed());
-    EXPECT_EQ(StatusText(), "Save not completed");
-    EXPECT_TRUE(m_frame->Config().flat_busses);
-}
-
-// A file that exists but cannot be read: an I/O error that root gets as well.
-TEST_F(FileFrameTest, GenerateNoWithAnUnreadableFileSavesNothingAndStaysOpen)
-{
-    if (access("/proc/self/mem", R_OK) != 0)
-        GTEST_SKIP() << "no /proc";
-    Change();
-    m_frame->Config().file_path = "/proc/self/mem";
-    DialogScript().Question(GENERATE_QUESTION, wxID_NO).Run([&] { Tool(ID_TOOL_GENERATE); });
-    EXPECT_FALSE(Closed());
-    EXPECT_EQ(StatusText(),
-              "Configuration /proc/self/mem could not be read: " + wxSysErrorMsgStr(EIO));
-    EXPECT_TRUE(m_frame->Config().flat_busses);
-    EXPECT_FALSE(m_frame->Config().generate);
-}
-
-TEST_F(FileFrameTest, QuitAsksLikeTheCloseButton)
-{
-    Change();
-    wxCommandEvent quit(wxEVT_MENU, ID_QUIT);
-    DialogScript()
-        .Question(CLOSE_QUESTION, wxID_CANCEL)
-        .Run([&] { m_frame->HandleWindowEvent(quit); });
-    EXPECT_FALSE(Closed());
-    DialogScript().Question(CLOSE_QUESTION, wxID_NO).Run([&] { m_frame->HandleWindowEvent(quit); });
-    EXPECT_TRUE(Closed());
-}
+INSTANTIATE_TEST_SUITE_P(Table, WayOut, testing::ValuesIn(WAYS),
+                         [](const auto& info) { return std::string(info.param.name); });
 
 } // namespace
