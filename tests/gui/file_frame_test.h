@@ -28,38 +28,34 @@ inline const char* const GENERATE_QUESTION =
 // One dialog as the program must show it, over the main window, and the answer it gets: a
 // question (caption "Save", Yes, No and Cancel, no icon asked for) or a file chooser (its title,
 // the INI wildcard, exactly the style asked for) that returns the given path.
-class Dialog : public wxModalExpectation
+struct Dialog : wxModalExpectation
 {
-  public:
     Dialog(long style, const wxString& text, int answer, const std::string& path = "")
         : m_style(style), m_text(text), m_answer(answer), m_path(path)
     {
     }
-
-  protected:
     int Invoke(wxDialog* dialog) const override
     {
         EXPECT_NE(dynamic_cast<ConfigFrame*>(dialog->GetParent()), nullptr);
-        auto* question = dynamic_cast<wxMessageDialog*>(dialog);
-        auto* chooser = dynamic_cast<wxFileDialog*>(dialog);
-        if (question)
+        if (auto* question = dynamic_cast<wxMessageDialog*>(dialog))
         {
             EXPECT_EQ(question->GetMessage(), m_text);
             EXPECT_EQ(question->GetCaption(), "Save");
             EXPECT_EQ(question->GetMessageDialogStyle(), m_style);
         }
-        else if (chooser)
+        else if (auto* chooser = dynamic_cast<wxFileDialog*>(dialog))
         {
             EXPECT_EQ(chooser->GetMessage(), m_text);
             EXPECT_EQ(chooser->GetWildcard(), "INI files (*.ini)|*.ini");
             EXPECT_EQ(chooser->GetWindowStyle(), m_style);
             chooser->SetPath(m_path);
         }
-        return question || chooser ? m_answer : wxID_NONE;
+        else
+            return wxID_NONE;
+        return m_answer;
     }
     wxString GetDefaultDescription() const override { return "dialog \"" + m_text + "\""; }
 
-  private:
     long m_style;
     wxString m_text;
     int m_answer;
@@ -67,13 +63,12 @@ class Dialog : public wxModalExpectation
 };
 
 inline Dialog Question(const char* text, int answer) { return {wxYES_NO | wxCANCEL, text, answer}; }
-inline Dialog OpenFile(const std::string& path, int answer = wxID_OK)
+// The open or the save chooser; "" cancels it.
+inline Dialog Chooser(bool open, const std::string& path)
 {
-    return Dialog(wxFD_OPEN, "Open a Configuration File", answer, path);
-}
-inline Dialog SaveFile(const std::string& path, int answer = wxID_OK)
-{
-    return Dialog(wxFD_SAVE, "Save a Configuration File", answer, path);
+    return {open ? wxFD_OPEN : wxFD_SAVE,
+            open ? "Open a Configuration File" : "Save a Configuration File",
+            path.empty() ? wxID_CANCEL : wxID_OK, path};
 }
 
 // The dialogs one action must show, in order; any other dialog, or one missing, fails the test.
@@ -98,24 +93,21 @@ inline std::string Slurp(const std::filesystem::path& path)
 }
 
 // Makes every write past a few bytes fail, as a full disk would; root is bound by it too.
-class WritesFail
+struct WritesFail
 {
-  public:
-    WritesFail() : m_handler(signal(SIGXFSZ, SIG_IGN))
+    void (*handler)(int) = signal(SIGXFSZ, SIG_IGN);
+    rlimit saved = {};
+    WritesFail()
     {
-        getrlimit(RLIMIT_FSIZE, &m_saved);
-        const struct rlimit small = {16, m_saved.rlim_max};
+        getrlimit(RLIMIT_FSIZE, &saved);
+        const rlimit small = {16, saved.rlim_max};
         setrlimit(RLIMIT_FSIZE, &small);
     }
     ~WritesFail()
     {
-        setrlimit(RLIMIT_FSIZE, &m_saved);
-        signal(SIGXFSZ, m_handler);
+        setrlimit(RLIMIT_FSIZE, &saved);
+        signal(SIGXFSZ, handler);
     }
-
-  private:
-    void (*m_handler)(int);
-    struct rlimit m_saved;
 };
 
 // A configuration as another program may have left it: comments, a key and a group the tool does
@@ -166,12 +158,7 @@ class FileFrameTest : public FrameTest
     // A tool pressed as the toolkit reports a click.
     void Tool(int id) { m_frame->GetToolBar()->OnLeftClick(id, false); }
     // A status text; "%s" stands for the scratch folder.
-    wxString Status(const char* text) const
-    {
-        wxString status(text);
-        status.Replace("%s", m_dir.string());
-        return status;
-    }
+    wxString Status(const char* text) const { return wxString::Format(text, m_dir.string()); }
 
     std::filesystem::path m_dir;
 };

@@ -61,21 +61,19 @@ TEST_P(WayOut, LeavesTheFileTheNetlisterExpects)
     if (c.answer)
         dialogs.push_back(Question(generateAsks ? GENERATE_QUESTION : CLOSE_QUESTION, c.answer));
     if ((c.state & NO_PATH) && c.answer == wxID_YES)
-        dialogs.push_back(SaveFile("", wxID_CANCEL));
+        dialogs.push_back(Chooser(false, ""));
     {
         std::optional<WritesFail> full;
         if (c.state & FULL_DISK)
             full.emplace();
-        wxCommandEvent quit(wxEVT_MENU, ID_QUIT);
+        // Quit has no control of its own: its command reaches the frame as a tool's does.
         WithDialogs(dialogs,
                     [&]
                     {
-                        if (c.way == GENERATE)
-                            Tool(ID_TOOL_GENERATE);
-                        else if (c.way == CLOSE)
+                        if (c.way == CLOSE)
                             m_frame->Close();
                         else
-                            m_frame->HandleWindowEvent(quit);
+                            Tool(c.way);
                     });
     }
 

@@ -49,43 +49,8 @@ std::string Slurp(const fs::path& path)
     return {std::istreambuf_iterator<char>(in), std::istreambuf_iterator<char>()};
 }
 
-std::string InDefaults(const fs::path& path, const char* key)
-{
-    return ParseIni(Slurp(path))->Read(wxString("/Defaults/") + key, "-").ToStdString();
-}
-
-// The program as the netlister starts it: one argument, the configuration file.
-struct Program
-{
-    explicit Program(const fs::path& config)
-    {
-        std::string path = config.string();
-        char* argv[] = {const_cast<char*>(PROGRAM), path.data(), nullptr};
-        if (posix_spawn(&pid, PROGRAM, nullptr, nullptr, argv, environ) != 0)
-            pid = -1;
-    }
-    ~Program()
-    {
-        if (pid > 0 && !status && kill(pid, SIGKILL) == 0)
-            waitpid(pid, nullptr, 0);
-    }
-    // The raw wait status once the program has ended by itself (0: exit status 0), or nothing.
-    std::optional<int> Ended()
-    {
-        if (!status)
-            status = Poll(
-                [this]
-                {
-                    int raw = 0;
-                    return waitpid(pid, &raw, WNOHANG) == pid ? std::optional(raw) : std::nullopt;
-                });
-        return status;
-    }
-
-    pid_t pid = -1;
-    std::optional<int> status;
-};
-
+// The program started as the netlister starts it, with one argument, the configuration file, and
+// its main window once start-up has loaded that file.
 class HandOff : public testing::Test
 {
   protected:
@@ -103,17 +68,33 @@ class HandOff : public testing::Test
         ASSERT_NE(mkdtemp(pattern), nullptr);
         m_file = fs::path(pattern) / "netlist.ini";
         std::ofstream(m_file, std::ios::binary) << CONFIG;
+
+        char* argv[] = {const_cast<char*>(PROGRAM), const_cast<char*>(m_file.c_str()), nullptr};
+        ASSERT_EQ(posix_spawn(&m_pid, PROGRAM, nullptr, nullptr, argv, environ), 0);
+        m_window = StartedWindow();
+        ASSERT_NE(m_window, 0u) << "no window with an enabled Generate tool";
     }
     void TearDown() override
     {
+        if (m_pid > 0 && !m_status && kill(m_pid, SIGKILL) == 0)
+            waitpid(m_pid, nullptr, 0);
         if (m_display)
             XCloseDisplay(m_display);
         fs::remove_all(m_file.parent_path());
     }
 
-    // The program's main window once start-up has loaded the file: only then is the Generate
-    // tool enabled, and the toolkit greys a disabled one. Notes where the tool shows.
-    Window StartedWindow(pid_t pid)
+    // The raw wait status once the program has ended by itself (0: exit status 0), or nothing.
+    std::optional<int> Ended()
+    {
+        int raw = 0;
+        if (Poll([&] { return waitpid(m_pid, &raw, WNOHANG) == m_pid; }))
+            m_status = raw;
+        return m_status;
+    }
+
+    // Only once start-up has loaded the file is the Generate tool enabled, and the toolkit greys
+    // a disabled one. Notes where the tool shows.
+    Window StartedWindow()
     {
         const Atom pidAtom = XInternAtom(m_display, "_NET_WM_PID", False);
         return Poll(
@@ -131,7 +112,7 @@ class HandOff : public testing::Test
                     unsigned char* data = nullptr;
                     XGetWindowProperty(m_display, children[i], pidAtom, 0, 1, False, XA_CARDINAL,
                                        &type, &format, &items, &left, &data);
-                    if (items == 1 && *reinterpret_cast<unsigned long*>(data) == unsigned(pid) &&
+                    if (items == 1 && *reinterpret_cast<unsigned long*>(data) == unsigned(m_pid) &&
                         (m_generateTool = FindPicture(children[i], COMMAND_BAR_PIXELS[6])))
                         found = children[i];
                     XFree(data);
@@ -147,11 +128,11 @@ class HandOff : public testing::Test
     std::optional<std::pair<int, int>> FindPicture(Window window, const unsigned char* picture)
     {
         const int width = 480, height = 100;
-        XImage* shot = XGetImage(m_display, window, 0, 0, width, height, AllPlanes, ZPixmap);
+        const std::unique_ptr<XImage, int (*)(XImage*)> shot(
+            XGetImage(m_display, window, 0, 0, width, height, AllPlanes, ZPixmap),
+            [](XImage* image) { return XDestroyImage(image); });
         if (!shot)
             return std::nullopt;
-        const std::unique_ptr<XImage, int (*)(XImage*)> owned(shot, [](XImage* image)
-                                                              { return XDestroyImage(image); });
         for (int top = 0; top + 24 <= height; ++top)
             for (int left = 0; left + 24 <= width; ++left)
             {
@@ -161,7 +142,7 @@ class HandOff : public testing::Test
                     const unsigned char* p = picture + 3 * i;
                     const bool transparent = p[0] == 236 && p[1] == 233 && p[2] == 216;
                     // The display is 24 bits deep: a pixel is 0xRRGGBB.
-                    same = transparent || XGetPixel(shot, left + i % 24, top + i / 24) ==
+                    same = transparent || XGetPixel(shot.get(), left + i % 24, top + i / 24) ==
                                               unsigned(p[0] << 16 | p[1] << 8 | p[2]);
                 }
                 if (same)
@@ -176,44 +157,35 @@ class HandOff : public testing::Test
 
     Display* m_display = XOpenDisplay(nullptr);
     fs::path m_file;
+    pid_t m_pid = -1;
+    std::optional<int> m_status;
+    Window m_window = 0;
     std::optional<std::pair<int, int>> m_generateTool;
 };
 
 TEST_F(HandOff, GenerateToolWritesYesAndEndsWithStatusZero)
 {
-    Program program(m_file);
-    const Window window = StartedWindow(program.pid);
-    ASSERT_NE(window, 0u) << "no window with an enabled Generate tool";
-
     // A real pointer: it enters the tool, rests, and clicks.
     const auto [x, y] = *m_generateTool;
-    const std::string click = "xdotool mousemove --window " + std::to_string(window) + " " +
+    const std::string click = "xdotool mousemove --window " + std::to_string(m_window) + " " +
                               std::to_string(x) + " " + std::to_string(y) + " sleep 0.3 click 1";
     ASSERT_EQ(std::system(click.c_str()), 0) << "xdotool missing or failed";
-
-    EXPECT_EQ(program.Ended(), 0) << "raw wait status; none: it did not end";
-    EXPECT_EQ(InDefaults(m_file, "generate"), "yes");
+    EXPECT_EQ(Ended(), 0) << "raw wait status; none: it did not end";
+    EXPECT_EQ(ParseIni(Slurp(m_file))->Read("/Defaults/generate", "-"), "yes");
 }
 
 TEST_F(HandOff, ClosedByTheWindowManagerLeavesTheFileAsItWas)
 {
-    Program program(m_file);
-    const Window window = StartedWindow(program.pid);
-    ASSERT_NE(window, 0u) << "start-up did not finish";
     // What a window manager sends when the user closes the window.
     XEvent event{};
-    event.xclient = {ClientMessage,
-                     0,
-                     True,
-                     m_display,
-                     window,
-                     XInternAtom(m_display, "WM_PROTOCOLS", False),
-                     32,
-                     {}};
+    event.xclient.type = ClientMessage;
+    event.xclient.window = m_window;
+    event.xclient.message_type = XInternAtom(m_display, "WM_PROTOCOLS", False);
+    event.xclient.format = 32;
     event.xclient.data.l[0] = long(XInternAtom(m_display, "WM_DELETE_WINDOW", False));
-    XSendEvent(m_display, window, False, NoEventMask, &event);
+    XSendEvent(m_display, m_window, False, NoEventMask, &event);
     XFlush(m_display);
-    EXPECT_EQ(program.Ended(), 0) << "raw wait status; none: it did not end";
+    EXPECT_EQ(Ended(), 0) << "raw wait status; none: it did not end";
     EXPECT_EQ(Slurp(m_file), CONFIG);
 }
 
