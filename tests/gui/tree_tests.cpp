@@ -14,11 +14,10 @@ namespace
 std::string Dump(wxTreeCtrl* tree, const wxTreeItemId& node, int depth = 0)
 {
     const OptionItemData* data = NodeData(tree, node);
-    wxString line =
-        wxString(' ', 2 * depth) + tree->GetItemText(node) +
-        (data ? wxString::Format(" | %d %d", data->pageId, data->page->GetId()) : " | -");
+    wxString line = wxString(' ', 2 * depth) + tree->GetItemText(node);
+    line << (data ? wxString::Format(" | %d %d", data->pageId, data->page->GetId()) : " | -");
     if (tree->ItemHasChildren(node))
-        line += tree->IsExpanded(node) ? " +" : " -";
+        line << (tree->IsExpanded(node) ? " +" : " -");
     std::string out = (line + "\n").utf8_string();
     wxTreeItemIdValue cookie;
     for (auto child = tree->GetFirstChild(node, cookie); child.IsOk();
@@ -27,24 +26,7 @@ std::string Dump(wxTreeCtrl* tree, const wxTreeItemId& node, int depth = 0)
     return out;
 }
 
-class OptionTree : public FrameTest
-{
-  protected:
-    wxTreeCtrl* Tree() const { return m_frame->Tree(); }
-    std::string DumpAll() const { return Dump(Tree(), Tree()->GetRootItem()); }
-    // The labels of the nodes with ids `first` to `last`, "" for an id not in the tree.
-    std::string Labels(int first, int last) const
-    {
-        std::string out;
-        for (int id = first; id <= last; ++id)
-            out += (id > first ? "|" : "") + NodeText(id).utf8_string();
-        return out;
-    }
-    wxTreeItemId Find(int pageId) const
-    {
-        return ConfigFrame::FindNodeByPageId(Tree(), pageId, Tree()->GetRootItem());
-    }
-};
+using OptionTree = FrameTest;
 
 } // namespace
 
@@ -95,16 +77,15 @@ TEST_F(OptionTree, DefaultRecordGivesTheWholeTable)
           LIBRARY ieee; | 6038 5007
           USE ieee.std_logic_1164.ALL; | 6038 5007
 )";
-    EXPECT_EQ(DumpAll(), expected);
+    EXPECT_EQ(Dump(m_frame->Tree(), m_frame->Tree()->GetRootItem()), expected);
     // A code no language has is shown as Spice and becomes Spice; the rebuild replaces the tree.
     m_frame->Config().default_orviktype = 'X';
     m_frame->BuildOptionTree();
     wxYield();
-    EXPECT_EQ(DumpAll(), expected);
+    EXPECT_EQ(Dump(m_frame->Tree(), m_frame->Tree()->GetRootItem()), expected);
     EXPECT_TRUE(m_frame->Config().default_orviktype == 'A' && m_frame->Config().saved);
 
-    EXPECT_EQ(Tree()->GetItemText(Find(NODE_LIBRARY_ENTRY)), "Generic"); // the first, pre-order
-    EXPECT_FALSE(Find(6020).IsOk());
+    EXPECT_EQ(NodeText(NODE_LIBRARY_ENTRY), "Generic"); // the first, pre-order
 }
 
 // Flags alternate from node to node, so that a label showing a neighbour's flag shows up. An empty
@@ -123,7 +104,11 @@ TEST_F(OptionTree, OtherValuesFollowTheirRules)
     c.library_definitions = {
         {"Work", "USE work.all;"}, {"work", "LIBRARY work;"}, {"work", "USE work.pkg.all;"}};
     m_frame->BuildOptionTree();
-    EXPECT_EQ(Labels(NODE_OPEN_CONFIG_DIALOG, NODE_ACTIVE_LIBRARY),
+    // "" for an id not in the tree.
+    std::string labels;
+    for (int id = NODE_OPEN_CONFIG_DIALOG; id <= NODE_ACTIVE_LIBRARY; ++id)
+        labels += NodeText(id).utf8_string() + "|";
+    EXPECT_EQ(labels,
               "Open configuration tool: Yes|Backup netlist: No|Backup extention: \"\"|"
               "Show netlist: Yes|Show pattern: No|Run ORVIK: Yes|Load circuit: No|Netlist type||"
               "Verilog|VHDL|Default language: VHDL|Flatten netlist: Yes|Flatten busses: No|"
@@ -132,8 +117,11 @@ TEST_F(OptionTree, OtherValuesFollowTheirRules)
               "Use global net: No|Supply 1: |Supply 0: gnd|Time scale: Use defined||"
               "Precision: 1ps|Capacitor: Use defined|Scale: 2|Delais coefficient: 0.5|"
               "Net type: Undefined|Net bus: bit_vector|Architecture name: \u00e9t\u00e9|"
-              "Configuration Prefix Name: CFG|Active Library: Work");
-    EXPECT_EQ(Dump(Tree(), Find(NODE_LIBRARY_DEFINITIONS)), R"(Library Definitions | 6037 5007 +
+              "Configuration Prefix Name: CFG|Active Library: Work|");
+    wxTreeCtrl* tree = m_frame->Tree();
+    EXPECT_EQ(Dump(tree, ConfigFrame::FindNodeByPageId(tree, NODE_LIBRARY_DEFINITIONS,
+                                                       tree->GetRootItem())),
+              R"(Library Definitions | 6037 5007 +
   Work | 6038 5007 -
     USE work.all; | 6038 5007
   work | 6038 5007 -
