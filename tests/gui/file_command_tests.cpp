@@ -32,7 +32,9 @@ class FileCommandTest : public FileFrameTest
     {
         const ConfigRecord& record = m_frame->Config();
         if (!ini.empty())
+        {
             EXPECT_EQ(FormatIni(record), ini);
+        }
         EXPECT_EQ(record.file_path, path);
         EXPECT_EQ(record.config_name, name);
         EXPECT_EQ(record.saved, saved);
