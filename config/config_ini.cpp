@@ -9,6 +9,7 @@
 #include <algorithm>
 #include <cctype>
 #include <cstring>
+#include <numeric>
 #include <variant>
 
 namespace
@@ -214,9 +215,14 @@ std::vector<std::string> ReadValues(wxConfigBase& ini, const char* prefix)
         entries.push_back(std::move(entry));
     }
     ini.SetExpandEnvVars(expand);
-    std::stable_sort(entries.begin(), entries.end(),
-                     [](const Entry& a, const Entry& b)
+    // Sorting positions, not entries, moves no text.
+    std::vector<size_t> order(entries.size());
+    std::iota(order.begin(), order.end(), size_t(0));
+    std::stable_sort(order.begin(), order.end(),
+                     [&](size_t left, size_t right)
                      {
+                         const Entry& a = entries[left];
+                         const Entry& b = entries[right];
                          if (a.numbered != b.numbered || !a.numbered)
                              return a.numbered && !b.numbered;
                          if (a.number.length() != b.number.length())
@@ -226,8 +232,8 @@ std::vector<std::string> ReadValues(wxConfigBase& ini, const char* prefix)
 
     std::vector<std::string> values;
     values.reserve(entries.size());
-    for (Entry& entry : entries)
-        values.push_back(std::move(entry.value));
+    for (const size_t index : order)
+        values.push_back(std::move(entries[index].value));
     return values;
 }
 
@@ -304,8 +310,8 @@ void ConfigRecord::ReadIni(wxConfigBase& ini)
     {
         ini.SetPath("/" + library);
         const std::string name = IniToBytes(library);
-        for (const std::string& line : ReadValues(ini, "line"))
-            AddLibraryLine(name, line);
+        for (std::string& line : ReadValues(ini, "line"))
+            AddLibraryLine(name, std::move(line));
     }
     ini.SetPath("/");
 }

@@ -1,6 +1,7 @@
 #include "config/config_record.h"
 
 #include <algorithm>
+#include <utility>
 
 ConfigRecord::ConfigRecord()
 {
@@ -30,12 +31,12 @@ bool EntryBefore(const LibraryLine& entry, const std::string& name) { return ent
 
 } // namespace
 
-void ConfigRecord::AddLibraryLine(const std::string& name, const std::string& line)
+void ConfigRecord::AddLibraryLine(const std::string& name, std::string line)
 {
     // After the library's other lines; reading a file appends at the end, so this stays cheap.
     const auto at =
         std::upper_bound(library_definitions.begin(), library_definitions.end(), name, NameBefore);
-    library_definitions.insert(at, LibraryLine{name, line});
+    library_definitions.insert(at, LibraryLine{name, std::move(line)});
 }
 
 void ConfigRecord::RemoveLibrary(const std::string& name)

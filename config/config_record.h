@@ -81,7 +81,7 @@ struct ConfigRecord
     // Removes the first entry with the same bytes, if any.
     void RemoveLibraryPath(const std::string& path);
     // Inserts after every entry whose name sorts before or equal to `name`.
-    void AddLibraryLine(const std::string& name, const std::string& line);
+    void AddLibraryLine(const std::string& name, std::string line);
     void RemoveLibrary(const std::string& name);
 
     void ReadIni(wxConfigBase& ini);

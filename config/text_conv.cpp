@@ -17,14 +17,23 @@ wxString BytesToIni(const std::string& bytes)
 
 std::string IniToBytes(const wxString& text)
 {
-    std::string bytes;
-    bytes.reserve(text.length());
     const wxStringCharType* chars = text.wx_str();
-    for (size_t i = 0; i < text.length(); ++i)
+    const size_t length = text.length();
+    std::string bytes(length, '\0');
+    size_t i = 0;
+    for (; i < length && static_cast<wxUint32>(chars[i]) < 0x100; ++i)
+        bytes[i] = static_cast<char>(chars[i]);
+    if (i == length)
+        return bytes;
+
+    // Only text from outside the file, an expanded variable, gets here: its characters become
+    // UTF-8, the file's own bytes stay as they were.
+    bytes.resize(i);
+    for (; i < length; ++i)
     {
         if (static_cast<wxUint32>(chars[i]) < 0x100)
             bytes.push_back(static_cast<char>(chars[i]));
-        else // only text from outside the file, an expanded variable, gets here
+        else
             bytes += wxString(chars[i]).utf8_string();
     }
     return bytes;
