@@ -1,4 +1,5 @@
-// The configuration library runs without a display.
+// The main of the tests that need wxBase only: the configuration library runs without a
+// display, and the process tests watch the program from outside.
 #include "tests/test_guards.h"
 
 #include <wx/init.h>

@@ -2,12 +2,10 @@
 // its own process, driven by real X input, judged by its exit status and the file alone.
 #include "config/ini_file.h"
 #include "resources/image_data.h"
-#include "tests/test_guards.h"
 
 #include <gtest/gtest.h>
 
 #include <wx/fileconf.h>
-#include <wx/init.h>
 
 #include <X11/Xatom.h>
 #include <X11/Xlib.h>
@@ -190,13 +188,3 @@ TEST_F(HandOff, ClosedByTheWindowManagerLeavesTheFileAsItWas)
 }
 
 } // namespace
-
-int main(int argc, char** argv)
-{
-    testing::InitGoogleTest(&argc, argv);
-    wxInitializer wx(argc, argv);
-    if (!wx.IsOk())
-        return 1;
-    InstallTestGuards();
-    return RUN_ALL_TESTS();
-}
