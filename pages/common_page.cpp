@@ -8,7 +8,6 @@
 #include <wx/combobox.h>
 #include <wx/intl.h>
 #include <wx/sizer.h>
-#include <wx/statbox.h>
 #include <wx/stattext.h>
 
 namespace
@@ -29,9 +28,7 @@ wxSizer* ConfigFrame::BuildCommonPage(wxWindow* parent, bool callFit, bool setSi
 {
     auto* top = new wxBoxSizer(wxVERTICAL);
 
-    auto* before =
-        new wxStaticBoxSizer(new wxStaticBox(parent, wxID_ANY, _("Before netlisting")), wxVERTICAL);
-    top->Add(before, 0, wxGROW | wxALL, 5);
+    auto* before = AddOptionBox(top, parent, _("Before netlisting"));
     AddOptionRow(before,
                  NewCheckBox(parent, ID_OPEN_CONFIG_DIALOG, _("Open ZidovAde configuration"),
                              _("Open this configuration manager before each netlist generation")));
@@ -51,9 +48,7 @@ wxSizer* ConfigFrame::BuildCommonPage(wxWindow* parent, bool callFit, bool setSi
                                   wxSize(100, -1), WXSIZEOF(extensions), extensions, wxCB_DROPDOWN),
                    0, wxALIGN_CENTER, 5);
 
-    auto* after =
-        new wxStaticBoxSizer(new wxStaticBox(parent, wxID_ANY, _("After netlisting")), wxVERTICAL);
-    top->Add(after, 0, wxGROW | wxALL, 5);
+    auto* after = AddOptionBox(top, parent, _("After netlisting"));
     AddOptionRow(
         after,
         NewCheckBox(parent, ID_SHOW_NETLIST, _("Show netlist file (.nsx) "),

@@ -7,15 +7,12 @@
 #include <wx/intl.h>
 #include <wx/radiobox.h>
 #include <wx/sizer.h>
-#include <wx/statbox.h>
 
 wxSizer* ConfigFrame::BuildNetlistTypePage(wxWindow* parent, bool callFit, bool setSizer)
 {
     auto* top = new wxBoxSizer(wxVERTICAL);
 
-    auto* types =
-        new wxStaticBoxSizer(new wxStaticBox(parent, wxID_ANY, _("Netlist type")), wxVERTICAL);
-    top->Add(types, 0, wxGROW | wxALL, 5);
+    auto* types = AddOptionBox(top, parent, _("Netlist type"));
     AddOptionRow(types, NewCheckBox(parent, ID_ALLOW_SPICE, _("SPICE"),
                                     _("Select SPICE as allowed netlisting language")));
     AddOptionRow(types, NewCheckBox(parent, ID_ALLOW_VERILOG, _("Verilog"),
@@ -32,9 +29,7 @@ wxSizer* ConfigFrame::BuildNetlistTypePage(wxWindow* parent, bool callFit, bool 
                            "specified on a model"));
     top->Add(language, 0, wxGROW | wxALL, 5);
 
-    auto* options =
-        new wxStaticBoxSizer(new wxStaticBox(parent, wxID_ANY, _("Netlist options")), wxVERTICAL);
-    top->Add(options, 0, wxGROW | wxALL, 5);
+    auto* options = AddOptionBox(top, parent, _("Netlist options"));
     AddOptionRow(options,
                  NewCheckBox(parent, ID_FLATTEN_NETLIST, _("Flatten netlist (Verilog only)"),
                              _("Netlist with no hierarchy and produce flat netlist")));

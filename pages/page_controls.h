@@ -4,6 +4,7 @@
 
 #include <wx/checkbox.h>
 #include <wx/sizer.h>
+#include <wx/statbox.h>
 #include <wx/treectrl.h>
 #include <wx/weakref.h>
 
@@ -12,6 +13,14 @@ inline wxCheckBox* NewCheckBox(wxWindow* parent, int id, const wxString& label, 
 {
     auto* box = new wxCheckBox(parent, id, label);
     box->SetToolTip(tip);
+    return box;
+}
+
+// A titled group of options, stretched across the page.
+inline wxStaticBoxSizer* AddOptionBox(wxSizer* top, wxWindow* parent, const wxString& title)
+{
+    auto* box = new wxStaticBoxSizer(new wxStaticBox(parent, wxID_ANY, title), wxVERTICAL);
+    top->Add(box, 0, wxGROW | wxALL, 5);
     return box;
 }
 

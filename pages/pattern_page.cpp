@@ -11,7 +11,6 @@
 #include <wx/intl.h>
 #include <wx/listbox.h>
 #include <wx/sizer.h>
-#include <wx/statbox.h>
 
 #include <algorithm>
 
@@ -44,17 +43,13 @@ wxSizer* ConfigFrame::BuildPatternPage(wxWindow* parent, bool callFit, bool setS
     // less than the list's 160 pixels, and a list of fixed height pushes "Remove" off the page.
     top->AddGrowableRow(1);
 
-    auto* pattern =
-        new wxStaticBoxSizer(new wxStaticBox(parent, wxID_ANY, _("Pattern Options")), wxVERTICAL);
-    top->Add(pattern, 0, wxGROW | wxALL, 5);
+    auto* pattern = AddOptionBox(top, parent, _("Pattern Options"));
     AddOptionRow(pattern, NewCheckBox(parent, ID_ADD_GLOBAL, _("Add .GLOBAL directive"),
                                       _("Add global nets in the .GLOBAL directive")));
     AddOptionRow(pattern, NewCheckBox(parent, ID_ADD_DC_SOURCES, _("Add DC sources"),
                                       _("Add voltage DC sources on unconnected IO pins")));
 
-    auto* libraries = new wxStaticBoxSizer(
-        new wxStaticBox(parent, wxID_ANY, _("Process Libraries Path / File")), wxVERTICAL);
-    top->Add(libraries, 0, wxGROW | wxALL, 5);
+    auto* libraries = AddOptionBox(top, parent, _("Process Libraries Path / File"));
     auto* list = new wxListBox(parent, ID_LIBRARY_PATH_LIST, wxDefaultPosition, wxSize(80, 160), 0,
                                nullptr, wxLB_SINGLE | wxLB_NEEDED_SB);
     list->SetMinSize(wxSize(80, 80));

@@ -6,7 +6,6 @@
 
 #include <wx/intl.h>
 #include <wx/sizer.h>
-#include <wx/statbox.h>
 
 wxSizer* ConfigFrame::BuildSpicePage(wxWindow* parent, bool callFit, bool setSizer)
 {
@@ -14,8 +13,7 @@ wxSizer* ConfigFrame::BuildSpicePage(wxWindow* parent, bool callFit, bool setSiz
     top->AddGrowableCol(0);
     top->AddGrowableRow(0);
 
-    auto* options =
-        new wxStaticBoxSizer(new wxStaticBox(parent, wxID_ANY, _("Spice Options")), wxVERTICAL);
+    auto* options = AddOptionBox(top, parent, _("Spice Options"));
     AddOptionRow(options,
                  NewCheckBox(parent, ID_SPICE_ADD_PREFIX,
                              _("Always add primitive prefix in front of instance name"),
@@ -30,7 +28,6 @@ wxSizer* ConfigFrame::BuildSpicePage(wxWindow* parent, bool callFit, bool setSiz
                              _("Indicate that transistors are connected in parallel so "
                                "the effective  widths are multiplied by the "
                                "multiplicity M")));
-    top->Add(options, 0, wxGROW | wxALL, 5);
 
     return InstallPageSizer(parent, top, callFit, setSizer);
 }
